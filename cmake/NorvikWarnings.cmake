@@ -1,0 +1,11 @@
+# Compiler flags shared by every target of the project.
+add_library(norvik_flags INTERFACE)
+target_compile_options(norvik_flags INTERFACE -Wall -Wextra)
+if(NORVIK_WERROR)
+  target_compile_options(norvik_flags INTERFACE -Werror)
+endif()
+if(NORVIK_SANITIZE)
+  set(_san -fsanitize=address,undefined -fno-omit-frame-pointer -fno-sanitize-recover=undefined)
+  target_compile_options(norvik_flags INTERFACE ${_san})
+  target_link_options(norvik_flags INTERFACE ${_san})
+endif()
