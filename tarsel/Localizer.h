@@ -4,8 +4,10 @@
 // text, "#{endl}" is a line end and "^}" an apostrophe; "@0".."@9" are slots
 // for ReplaceInString and "^0".."^3" slots for ThrowError.
 //
-// Translations are loaded per locale from key=value files: one "path=text" per
-// line (the path with or without its "$$$/" prefix), '#' starting a comment.
+// Translations are loaded per locale from key=value files in UTF-8 (with or
+// without a byte-order mark): one "path=text" per line, the path with or
+// without its "$$$/" prefix, blanks around both parts dropped, and '#'
+// starting a comment line.
 #include <map>
 #include <string>
 #include <string_view>
@@ -34,6 +36,14 @@ class Localizer {
   // Adds the entries of key=value text; answers how many it read.
   std::size_t LoadTranslationText(std::string_view inText);
   void ClearTranslations();
+
+  // Replaces the translations with those of a locale, read from
+  // "<inDirectory>/<name>.txt". The name is tried as given ("de_DE.UTF-8"),
+  // then without its code set and modifier ("de_DE"), then as the language
+  // alone ("de"). On success the locale name becomes inLocaleName and the
+  // answer is how many entries were read; when no file is found, the toolkit's
+  // exception is raised and the translations stay as they were.
+  std::size_t LoadLocale(const std::string& inDirectory, const std::string& inLocaleName);
 
   void SetLocaleName(const std::string& inName) { mLocaleName = inName; }
   const std::string& GetLocaleName() const { return mLocaleName; }

@@ -2,6 +2,7 @@
 
 #include <fstream>
 #include <sstream>
+#include <vector>
 
 #include "tarsel/ThrowError.h"
 
@@ -73,6 +74,7 @@ void Localizer::SetTranslation(std::string_view inPath, const UTF16String& inTex
 
 std::size_t Localizer::LoadTranslationText(std::string_view inText) {
   std::size_t count = 0;
+  if (inText.substr(0, 3) == "\xEF\xBB\xBF") inText.remove_prefix(3);
   while (!inText.empty()) {
     std::size_t end = inText.find('\n');
     std::string_view line = Trim(inText.substr(0, end));
@@ -80,7 +82,7 @@ std::size_t Localizer::LoadTranslationText(std::string_view inText) {
     if (line.empty() || line.front() == '#') continue;
     std::size_t eq = line.find('=');
     if (eq == std::string_view::npos || eq == 0) continue;
-    SetTranslation(Trim(line.substr(0, eq)), utility::UTF8to16(line.substr(eq + 1)));
+    SetTranslation(Trim(line.substr(0, eq)), utility::UTF8to16(Trim(line.substr(eq + 1))));
     ++count;
   }
   return count;
@@ -95,6 +97,26 @@ std::size_t Localizer::LoadTranslationFile(const std::string& inFilePath) {
   std::ostringstream text;
   text << in.rdbuf();
   return LoadTranslationText(text.str());
+}
+
+std::size_t Localizer::LoadLocale(const std::string& inDirectory, const std::string& inLocaleName) {
+  std::vector<std::string> candidates{inLocaleName};
+  std::string base = inLocaleName.substr(0, inLocaleName.find_first_of(".@"));
+  if (base != inLocaleName) candidates.push_back(base);
+  std::string language = base.substr(0, base.find('_'));
+  if (language != base) candidates.push_back(language);
+  for (const std::string& name : candidates) {
+    if (name.empty() || name.find('/') != std::string::npos) continue;
+    std::ifstream in(inDirectory + "/" + name + ".txt", std::ios::binary);
+    if (!in) continue;
+    std::ostringstream text;
+    text << in.rdbuf();
+    ClearTranslations();
+    mLocaleName = inLocaleName;
+    return LoadTranslationText(text.str());
+  }
+  ThrowError(ErrorLevel::kError, "$$$/tarsel/config/Error/LocaleNotFound=No translations for the locale ^0 in ^1.",
+             kErrorGroupResources, 3, false, ReplacementValue(inLocaleName), ReplacementValue(inDirectory));
 }
 
 void Localizer::ClearTranslations() { mTranslations.clear(); }

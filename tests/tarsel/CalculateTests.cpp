@@ -1,0 +1,170 @@
+// The arithmetic evaluator of number fields: precedence, signs, unit names,
+// locale marks, and the errors of hostile input.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <random>
+
+#include "tarsel/Locale.h"
+#include "tarsel/StringUtils.h"
+#include "tarsel/ThrowError.h"
+
+using namespace tarsel::utility;
+
+namespace {
+
+double Calc(std::u16string_view text) { return Calculate(text, kCalculateNoLocalization); }
+
+std::string ErrorOf(std::u16string_view text, unsigned short flags = kCalculateNoLocalization) {
+  try {
+    Calculate(text, flags);
+  } catch (const tarsel::config::Exception& e) {
+    return e.GetKeyPath();
+  }
+  return "no error";
+}
+
+}  // namespace
+
+TEST(Calculate, FollowsTheUsualPrecedenceAndLeftToRightOrder) {
+  EXPECT_DOUBLE_EQ(Calc(u"1+2*3"), 7);
+  EXPECT_DOUBLE_EQ(Calc(u"(1+2)*3"), 9);
+  EXPECT_DOUBLE_EQ(Calc(u"10-4-3"), 3);
+  EXPECT_DOUBLE_EQ(Calc(u"100/10/5"), 2);
+  EXPECT_DOUBLE_EQ(Calc(u"2*3-4/8"), 5.5);
+}
+
+TEST(Calculate, PowerIsRightAssociativeAndBindsTighterThanASign) {
+  EXPECT_DOUBLE_EQ(Calc(u"2^3^2"), 512);
+  EXPECT_DOUBLE_EQ(Calc(u"-2^2"), -4);
+  EXPECT_DOUBLE_EQ(Calc(u"2^-1"), 0.5);
+  EXPECT_DOUBLE_EQ(Calc(u"(-2)^2"), 4);
+  EXPECT_DOUBLE_EQ(Calc(u"4^0.5*3"), 6);
+}
+
+TEST(Calculate, UnarySignsDecimalsAndBlanks) {
+  EXPECT_DOUBLE_EQ(Calc(u"-3"), -3);
+  EXPECT_DOUBLE_EQ(Calc(u"--3"), 3);
+  EXPECT_DOUBLE_EQ(Calc(u"+-+3"), -3);
+  EXPECT_DOUBLE_EQ(Calc(u"  1.5 *\t-2  "), -3);
+  EXPECT_DOUBLE_EQ(Calc(u".25+.25"), 0.5);
+  EXPECT_DOUBLE_EQ(Calc(u"4 \u00D7 2 \u00F7 8 \u2212 1"), 0);
+  EXPECT_DOUBLE_EQ(Calc(u"1,000+1"), 1001);
+  EXPECT_DOUBLE_EQ(Calc(u"1.5e2/3"), 50);
+}
+
+TEST(Calculate, EqualsSignsAroundTheExpressionAreIgnored) {
+  EXPECT_DOUBLE_EQ(Calc(u"=2*3"), 6);
+  EXPECT_DOUBLE_EQ(Calc(u"2*3="), 6);
+  EXPECT_DOUBLE_EQ(Calc(u" = 2*3 = "), 6);
+  EXPECT_EQ(ErrorOf(u"2=3"), "tarsel/utility/Error/CalculateSyntax");
+}
+
+TEST(Calculate, BlankTextHoldsNoNumber) {
+  EXPECT_TRUE(std::isnan(Calc(u"")));
+  EXPECT_TRUE(std::isnan(Calc(u"   ")));
+  EXPECT_TRUE(std::isnan(Calc(u"=")));
+}
+
+TEST(Calculate, UnitNamesAreSkippedOnlyWhenAsked) {
+  EXPECT_DOUBLE_EQ(Calculate(u"12pt + 6pt", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 18);
+  EXPECT_DOUBLE_EQ(Calculate(u"p6", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 6);
+  EXPECT_DOUBLE_EQ(Calculate(u"50%", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 50);
+  EXPECT_DOUBLE_EQ(Calculate(u"90\u00B0 / 2", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 45);
+  EXPECT_DOUBLE_EQ(Calculate(u"2em", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 2);
+  EXPECT_DOUBLE_EQ(Calculate(u"1e2mm", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 100);
+  EXPECT_EQ(ErrorOf(u"12pt"), "tarsel/utility/Error/CalculateSyntax");
+}
+
+TEST(Calculate, LocalisedTextUsesTheDefaultLocaleMarks) {
+  tarsel::ScSetDefaultLocale german(tarsel::Locale("de_DE", u',', u'.'));
+  EXPECT_DOUBLE_EQ(Calculate(u"1,5 * 2", 0), 3);
+  EXPECT_DOUBLE_EQ(Calculate(u"1.000,5 + 1", 0), 1001.5);
+  EXPECT_DOUBLE_EQ(Calculate(u"1.5 * 2", kCalculateNoLocalization), 3);
+
+  // A blank as grouping mark groups only between digits; blanks around
+  // operators stay blanks.
+  tarsel::ScSetDefaultLocale blankGroups(tarsel::Locale("xx", u',', u' '));
+  EXPECT_DOUBLE_EQ(Calculate(u"1 000 + 2,5", 0), 1002.5);
+}
+
+TEST(Calculate, DivisionByZeroRaisesItsOwnError) {
+  EXPECT_EQ(ErrorOf(u"1/0"), "tarsel/utility/Error/DivisionByZero");
+  EXPECT_EQ(ErrorOf(u"1/(2-2)"), "tarsel/utility/Error/DivisionByZero");
+  EXPECT_EQ(ErrorOf(u"0^-1"), "tarsel/utility/Error/DivisionByZero");
+  try {
+    Calc(u"5/0");
+    FAIL() << "no exception";
+  } catch (const tarsel::config::Exception& e) {
+    EXPECT_STREQ(e.what(), "Division by zero.");
+  }
+}
+
+TEST(Calculate, ResultsBeyondTheRangeOfADoubleRaiseOverflow) {
+  EXPECT_EQ(ErrorOf(u"1e308*10"), "tarsel/utility/Error/CalculateOverflow");
+  EXPECT_EQ(ErrorOf(u"-1e308-1e308"), "tarsel/utility/Error/CalculateOverflow");
+  EXPECT_EQ(ErrorOf(u"10^400"), "tarsel/utility/Error/CalculateOverflow");
+  EXPECT_EQ(ErrorOf(u"1e999"), "tarsel/utility/Error/NumberOutOfRange");
+  EXPECT_EQ(ErrorOf(u"(-8)^0.5"), "tarsel/utility/Error/CalculateUndefined");
+}
+
+TEST(Calculate, MalformedTextRaisesASyntaxErrorWithItsPosition) {
+  for (const char16_t* bad : {u"1+", u"*2", u"(1+2", u"1+2)", u"()", u"1 2", u"1..2", u"abc", u"1+*2", u"2^", u"1e",
+                              u"\u221E", u"1,", u")("}) {
+    EXPECT_EQ(ErrorOf(bad), "tarsel/utility/Error/CalculateSyntax") << ToStdString(UTF16to8(bad));
+  }
+  try {
+    Calc(u"1 + x");
+    FAIL() << "no exception";
+  } catch (const tarsel::config::Exception& e) {
+    EXPECT_STREQ(e.what(), "The expression \"1 + x\" cannot be read at position 5.");
+  }
+}
+
+TEST(Calculate, EmbeddedNulIsASyntaxError) {
+  UTF16String text(u"1+\0" u"2", 4);
+  EXPECT_EQ(ErrorOf(text), "tarsel/utility/Error/CalculateSyntax");
+}
+
+TEST(Calculate, DeepNestingRaisesInsteadOfExhaustingTheStack) {
+  const std::size_t deep = 100000;
+  UTF16String parens = UTF16String(deep, u'(') + u"1" + UTF16String(deep, u')');
+  EXPECT_EQ(ErrorOf(parens), "tarsel/utility/Error/CalculateTooDeep");
+  EXPECT_EQ(ErrorOf(UTF16String(deep, u'-') + u"1"), "tarsel/utility/Error/CalculateTooDeep");
+  UTF16String powers = u"1";
+  for (int i = 0; i < 20000; ++i) powers += u"^1";
+  EXPECT_EQ(ErrorOf(powers), "tarsel/utility/Error/CalculateTooDeep");
+
+  // Nesting within the limit still evaluates.
+  const std::size_t fine = kCalculateMaxDepth - 1;
+  EXPECT_DOUBLE_EQ(Calc(UTF16String(fine, u'(') + u"7" + UTF16String(fine, u')')), 7);
+}
+
+TEST(Calculate, LongFlatExpressionsEvaluateWithoutDepth) {
+  UTF16String sum = u"0";
+  for (int i = 0; i < 50000; ++i) sum += u"+1";
+  EXPECT_DOUBLE_EQ(Calc(sum), 50000);
+}
+
+TEST(Calculate, AgreesWithDirectArithmeticOnGeneratedExpressions) {
+  std::mt19937 random(7);
+  std::uniform_int_distribution<int> operand(1, 99), op(0, 3);
+  const char16_t ops[] = {u'+', u'-', u'*', u'/'};
+  for (int round = 0; round < 500; ++round) {
+    // a op1 (b op2 c): written with parentheses so the expected value is plain.
+    int a = operand(random), b = operand(random), c = operand(random);
+    int o1 = op(random), o2 = op(random);
+    auto apply = [](double x, int o, double y) {
+      switch (o) {
+        case 0: return x + y;
+        case 1: return x - y;
+        case 2: return x * y;
+        default: return x / y;
+      }
+    };
+    double expected = apply(a, o1, apply(b, o2, c));
+    UTF16String text = NumberToString(static_cast<long>(a)) + ops[o1] + u"(" + NumberToString(static_cast<long>(b)) +
+                       u" " + ops[o2] + u" " + NumberToString(static_cast<long>(c)) + u")";
+    ASSERT_DOUBLE_EQ(Calc(text), expected) << ToStdString(UTF16to8(text));
+  }
+}

@@ -1,0 +1,251 @@
+// Numbers to text and back: rounding, width, signs, grouping, locale marks and
+// the errors of malformed text.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+#include <random>
+
+#include "tarsel/Locale.h"
+#include "tarsel/StringUtils.h"
+#include "tarsel/ThrowError.h"
+
+using namespace tarsel::utility;
+using tarsel::Locale;
+using tarsel::ScSetDefaultLocale;
+
+namespace {
+
+constexpr unsigned short kPlain = kNumberFormatNoLocalization;
+
+UTF16String Format(double value, int width, int places, unsigned short flags) {
+  return NumberToString(value, width, places, flags | kPlain, 31);
+}
+
+std::string KeyPathOfError(std::u16string_view text, unsigned short flags) {
+  try {
+    StringToNumber(text, flags);
+  } catch (const tarsel::config::Exception& e) {
+    return e.GetKeyPath();
+  }
+  return "no error";
+}
+
+const Locale kGerman("de_DE", u',', u'.');
+const Locale kFrench("fr_FR", u',', u'\u202F');
+
+}  // namespace
+
+TEST(NumberToString, IntegersAndShortestDoubles) {
+  EXPECT_EQ(NumberToString(0L), u"0");
+  EXPECT_EQ(NumberToString(-42L), u"-42");
+  EXPECT_EQ(NumberToString(std::numeric_limits<long>::min()), u"-9223372036854775808");
+  EXPECT_EQ(NumberToString(0.1), u"0.1");
+  EXPECT_EQ(NumberToString(-2.5), u"-2.5");
+  EXPECT_EQ(NumberToString(1e300), u"1e+300");
+  EXPECT_EQ(NumberToString(std::nan("")), u"NaN");
+  EXPECT_EQ(NumberToString(-HUGE_VAL), u"-\u221E");
+}
+
+TEST(NumberToString, RoundsHalfAwayFromZeroOnTheDigitsAReaderSees) {
+  EXPECT_EQ(Format(1.23456, 0, 2, 0), u"1.23");
+  EXPECT_EQ(Format(1.005, 0, 2, 0), u"1.01");
+  EXPECT_EQ(Format(2.675, 0, 2, 0), u"2.68");
+  EXPECT_EQ(Format(-2.5, 0, 0, 0), u"-3");
+  EXPECT_EQ(Format(0.5, 0, 0, 0), u"1");
+  EXPECT_EQ(Format(0.4999, 0, 0, 0), u"0");
+  EXPECT_EQ(Format(9.999, 0, 2, 0), u"10.00");
+  EXPECT_EQ(Format(99.96, 0, 1, 0), u"100.0");
+}
+
+TEST(NumberToString, PadsTheFractionWithZerosToTheDecimalPlaces) {
+  EXPECT_EQ(Format(1.5, 0, 3, 0), u"1.500");
+  EXPECT_EQ(Format(0.001, 0, 4, 0), u"0.0010");
+  EXPECT_EQ(Format(123, 0, 0, 0), u"123");
+  EXPECT_EQ(Format(1e-7, 0, 2, 0), u"0.00");
+}
+
+TEST(NumberToString, NegativeDecimalPlacesRoundToTensAndHundreds) {
+  EXPECT_EQ(Format(1234, 0, -1, 0), u"1230");
+  EXPECT_EQ(Format(1250, 0, -2, 0), u"1300");
+  EXPECT_EQ(Format(49, 0, -2, 0), u"0");
+}
+
+TEST(NumberToString, ZeroAfterRoundingHasNoMinusSign) {
+  EXPECT_EQ(Format(-0.001, 0, 2, 0), u"0.00");
+  EXPECT_EQ(Format(-0.0, 0, 0, 0), u"0");
+  EXPECT_EQ(Format(-0.006, 0, 2, 0), u"-0.01");
+}
+
+TEST(NumberToString, NoTrailingZerosDropsTheEmptyFraction) {
+  EXPECT_EQ(Format(1.5, 0, 4, kNumberFormatNoTrailingZeros), u"1.5");
+  EXPECT_EQ(Format(2.0, 0, 4, kNumberFormatNoTrailingZeros), u"2");
+  EXPECT_EQ(Format(100, 0, 2, kNumberFormatNoTrailingZeros), u"100");
+}
+
+TEST(NumberToString, MinimumWidthPadsWithZerosAfterTheSignOrWithSpacesBeforeIt) {
+  EXPECT_EQ(Format(7.5, 6, 1, 0), u"0007.5");
+  EXPECT_EQ(Format(-7.5, 6, 1, 0), u"-007.5");
+  EXPECT_EQ(Format(-7.5, 6, 1, kNumberFormatLeadingSpaces), u"  -7.5");
+  EXPECT_EQ(Format(12345, 3, 0, 0), u"12345");
+  EXPECT_EQ(Format(5, 1, 0, 0), u"5");
+}
+
+TEST(NumberToString, SignFlagsMarkNumbersThatAreNotNegative) {
+  EXPECT_EQ(Format(3, 0, 0, kNumberFormatAlwaysSign), u"+3");
+  EXPECT_EQ(Format(0, 0, 1, kNumberFormatAlwaysSign), u"+0.0");
+  EXPECT_EQ(Format(-3, 0, 0, kNumberFormatAlwaysSign), u"-3");
+  EXPECT_EQ(Format(3, 0, 0, kNumberFormatPadSign), u" 3");
+  EXPECT_EQ(Format(-3, 0, 0, kNumberFormatPadSign), u"-3");
+  EXPECT_EQ(Format(3, 0, 0, kNumberFormatPadSign | kNumberFormatAlwaysSign), u"+3");
+  EXPECT_EQ(Format(3, 4, 0, kNumberFormatAlwaysSign), u"+003");
+}
+
+TEST(NumberToString, SeparatorGroupsIntegerDigitsByThree) {
+  EXPECT_EQ(Format(1234567.891, 0, 2, kNumberFormatUseSeparator), u"1,234,567.89");
+  EXPECT_EQ(Format(-999, 0, 0, kNumberFormatUseSeparator), u"-999");
+  EXPECT_EQ(Format(-1000, 0, 0, kNumberFormatUseSeparator), u"-1,000");
+  EXPECT_EQ(Format(999.9999, 0, 2, kNumberFormatUseSeparator), u"1,000.00");
+}
+
+TEST(NumberToString, LocalisedFormUsesTheDefaultLocaleMarks) {
+  ScSetDefaultLocale german(kGerman);
+  EXPECT_EQ(NumberToString(1234.5, 0, 2, kNumberFormatUseSeparator, 31), u"1.234,50");
+  EXPECT_EQ(NumberToString(1234.5, 0, 2, kNumberFormatUseSeparator | kPlain, 31), u"1,234.50");
+  ScSetDefaultLocale french(kFrench);
+  EXPECT_EQ(NumberToString(-1234567, 0, 1, kNumberFormatUseSeparator, 31), u"-1\u202F234\u202F567,0");
+}
+
+TEST(NumberToString, NumbersTooLongForFixedPointSwitchToScientific) {
+  UTF16String huge = Format(1.7976931348623157e308, 0, 2, 0);
+  EXPECT_EQ(huge, u"1.80e+308");
+  EXPECT_EQ(Format(1e40, 0, 0, 0), u"1e+40");
+  EXPECT_EQ(Format(2.5e35, 0, 3, kNumberFormatNoTrailingZeros), u"2.5e+35");
+  // The limit is the caller's: a generous one keeps fixed point.
+  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 100).size(), 41u);
+  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 0).size(), 41u);
+}
+
+TEST(NumberToString, InfinityAndNaNAreWrittenAsSymbols) {
+  EXPECT_EQ(Format(HUGE_VAL, 0, 2, 0), u"\u221E");
+  EXPECT_EQ(Format(-HUGE_VAL, 0, 2, 0), u"-\u221E");
+  EXPECT_EQ(Format(HUGE_VAL, 0, 2, kNumberFormatAlwaysSign), u"+\u221E");
+  EXPECT_EQ(Format(std::nan(""), 0, 2, 0), u"NaN");
+}
+
+TEST(StringToNumber, ReadsPlainNumbersWithSignsBlanksGroupingAndExponents) {
+  EXPECT_DOUBLE_EQ(StringToNumber(u"1.25", kPlain), 1.25);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"  -3 ", kPlain), -3);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"+.5", kPlain), 0.5);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"7.", kPlain), 7);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"1,234,567.5", kPlain), 1234567.5);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"1.5e3", kPlain), 1500);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"2E-2", kPlain), 0.02);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"\u22124", kPlain), -4);
+  EXPECT_EQ(StringToNumber(u"-\u221E", kPlain), -HUGE_VAL);
+}
+
+TEST(StringToNumber, BlankTextHoldsNoNumber) {
+  EXPECT_TRUE(std::isnan(StringToNumber(u"", kPlain)));
+  EXPECT_TRUE(std::isnan(StringToNumber(u" \t ", 0)));
+}
+
+TEST(StringToNumber, MalformedTextRaisesNotANumberWithTheTextInTheMessage) {
+  for (const char16_t* bad : {u"abc", u"1.2.3", u"--1", u"+", u"1e", u"1,", u",1", u"1 2", u"0x10", u"inf", u"nan",
+                              u"1e+", u"5%", u".", u"\u221E\u221E"}) {
+    EXPECT_EQ(KeyPathOfError(bad, kPlain), "tarsel/utility/Error/NotANumber")
+        << ToStdString(UTF16to8(bad));
+  }
+  try {
+    StringToNumber(u"12ab", kPlain);
+    FAIL() << "no exception";
+  } catch (const tarsel::config::Exception& e) {
+    EXPECT_STREQ(e.what(), "\"12ab\" is not a number.");
+    EXPECT_EQ(e.GetGroup(), tarsel::config::kErrorGroupContract);
+    EXPECT_EQ(e.GetCode(), tarsel::config::kErrorCodeConversion);
+  }
+}
+
+TEST(StringToNumber, EmbeddedNulsAndHugeTextsAreRejectedWithAShortMessage) {
+  UTF16String withNul(u"12\0" u"3", 4);
+  EXPECT_EQ(KeyPathOfError(withNul, kPlain), "tarsel/utility/Error/NotANumber");
+  UTF16String huge(100000, u'9');
+  huge += u"x";
+  try {
+    StringToNumber(huge, kPlain);
+    FAIL() << "no exception";
+  } catch (const tarsel::config::Exception& e) {
+    EXPECT_LT(e.GetMessage().size(), 80u);
+  }
+}
+
+TEST(StringToNumber, OverflowRaisesOutOfRangeAndUnderflowReadsAsZero) {
+  EXPECT_EQ(KeyPathOfError(u"1e400", kPlain), "tarsel/utility/Error/NumberOutOfRange");
+  EXPECT_EQ(KeyPathOfError(u"-1e400", kPlain), "tarsel/utility/Error/NumberOutOfRange");
+  EXPECT_EQ(StringToNumber(u"1e-400", kPlain), 0.0);
+  // Three hundred and ten digits: a long but valid number.
+  EXPECT_EQ(KeyPathOfError(UTF16String(310, u'9'), kPlain), "tarsel/utility/Error/NumberOutOfRange");
+  EXPECT_DOUBLE_EQ(StringToNumber(UTF16String(300, u'1'), kPlain), 1.1111111111111111e299);
+}
+
+TEST(StringToNumber, LocalisedReadingFollowsTheDefaultLocale) {
+  ScSetDefaultLocale german(kGerman);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"1.234,5", 0), 1234.5);
+  EXPECT_DOUBLE_EQ(StringToNumber(u"1,234.5", kPlain), 1234.5);
+  EXPECT_EQ(KeyPathOfError(u"1,2,3", 0), "tarsel/utility/Error/NotANumber");
+}
+
+TEST(NumberRoundTrip, FormattedTextReadsBackAsTheRoundedValue) {
+  std::mt19937 random(20261122);
+  std::uniform_real_distribution<double> values(-1e7, 1e7);
+  const unsigned short flagSets[] = {0, kNumberFormatUseSeparator, kNumberFormatAlwaysSign | kNumberFormatUseSeparator,
+                                     kNumberFormatPadSign, kNumberFormatNoTrailingZeros};
+  for (const Locale& locale : {Locale(), kGerman, kFrench}) {
+    ScSetDefaultLocale scoped(locale);
+    for (int i = 0; i < 300; ++i) {
+      double value = values(random);
+      int places = i % 5;
+      for (unsigned short flags : flagSets) {
+        UTF16String text = NumberToString(value, 0, places, flags, 31);
+        double back = StringToNumber(text, 0);
+        double scale = std::pow(10.0, places);
+        ASSERT_NEAR(back, std::round(value * scale) / scale, 0.5 / scale + 1e-9)
+            << ToStdString(UTF16to8(text)) << " from " << value;
+      }
+    }
+  }
+}
+
+TEST(InternationalizeNum, SwapsMarksInOnePassAndDeInternationalizeUndoesIt) {
+  ScSetDefaultLocale german(kGerman);
+  UTF16String text = u"1,234.5 + 2.5";
+  InternationalizeNum(text);
+  EXPECT_EQ(text, u"1.234,5 + 2,5");
+  DeInternationalizeNum(text);
+  EXPECT_EQ(text, u"1,234.5 + 2.5");
+}
+
+TEST(InternationalizeNum, PlainLocaleLeavesTextUnchanged) {
+  ScSetDefaultLocale plain{Locale()};
+  UTF16String text = u"1,234.5";
+  InternationalizeNum(text);
+  EXPECT_EQ(text, u"1,234.5");
+  DeInternationalizeNum(text);
+  EXPECT_EQ(text, u"1,234.5");
+}
+
+TEST(LocaleDefault, ScopedReplacementIsRestored) {
+  const std::string before = Locale::Default().GetName();
+  {
+    ScSetDefaultLocale german(kGerman);
+    EXPECT_EQ(Locale::Default().GetName(), "de_DE");
+    EXPECT_EQ(Locale::Default().GetDecimalMark(), u',');
+  }
+  EXPECT_EQ(Locale::Default().GetName(), before);
+}
+
+TEST(LocaleDefault, EnvironmentLocaleHasDistinctMarks) {
+  Locale env = Locale::FromEnvironment();
+  EXPECT_NE(env.GetDecimalMark(), env.GetGroupingMark());
+  EXPECT_FALSE(env.GetName().empty());
+}

@@ -1,0 +1,107 @@
+// Text streams over UTF-16 and UTF-8 strings.
+#include <gtest/gtest.h>
+
+#include <vector>
+
+#include "tarsel/StringStreams.h"
+
+using namespace tarsel;
+
+namespace {
+
+class RecordingSink : public UTF16StreamSink {
+ public:
+  void Write(std::u16string_view inText) override {
+    chunks.emplace_back(inText);
+    all.append(inText.data(), inText.size());
+  }
+  std::vector<UTF16String> chunks;
+  UTF16String all;
+};
+
+}  // namespace
+
+TEST(iUTF16StringStream, ReadsNumbersAndWordsInTheClassicForm) {
+  iUTF16StringStream in(u"12 3.5 -7e1 größe");
+  int i = 0;
+  double d = 0, e = 0;
+  UTF16String word;
+  in >> i >> d >> e >> word;
+  ASSERT_FALSE(in.fail());
+  EXPECT_EQ(i, 12);
+  EXPECT_DOUBLE_EQ(d, 3.5);
+  EXPECT_DOUBLE_EQ(e, -70);
+  EXPECT_EQ(word, u"größe");
+  in >> i;
+  EXPECT_TRUE(in.fail());
+}
+
+TEST(iUTF16StringStream, MalformedNumbersFailTheStream) {
+  iUTF16StringStream in(u"abc");
+  double d = 1;
+  in >> d;
+  EXPECT_TRUE(in.fail());
+  in.str(u"4");
+  in >> d;
+  EXPECT_FALSE(in.fail());
+  EXPECT_DOUBLE_EQ(d, 4);
+}
+
+TEST(oUTF16StringStream, CollectsMixedTextAndNumbers) {
+  oUTF16StringStream out;
+  out << "gain " << 2.5 << UTF16String(u" dB ∞ ") << 42;
+  EXPECT_EQ(out.str(), u"gain 2.5 dB ∞ 42");
+  out.str(u"x=");
+  out << 1;
+  EXPECT_EQ(out.str(), u"x=1");
+}
+
+TEST(oUTF8StringStream, CollectsUTF8Text) {
+  oUTF8StringStream out;
+  out << UTF16String(u"Ω") << ' ' << 0.25;
+  EXPECT_EQ(out.str(), UTF8String("Ω 0.25"));
+}
+
+TEST(UTF16OutputStream, HandsTextToItsSinkOnFlush) {
+  RecordingSink sink;
+  UTF16OutputStream out(&sink);
+  out << "line " << 1;
+  EXPECT_TRUE(sink.all.empty());
+  out << std::endl;
+  EXPECT_EQ(sink.all, u"line 1\n");
+  out << UTF16String(u"état") << std::flush;
+  EXPECT_EQ(sink.all, u"line 1\nétat");
+}
+
+TEST(UTF16OutputStream, ACharacterCutByAFlushArrivesWhole) {
+  RecordingSink sink;
+  UTF16OutputStream out(&sink);
+  const char euro[] = "\xE2\x82\xAC";  // U+20AC in three bytes
+  out.write(euro, 1);
+  out.flush();
+  out.write(euro + 1, 2);
+  out.flush();
+  EXPECT_EQ(sink.all, u"€");
+  for (const UTF16String& chunk : sink.chunks) EXPECT_EQ(chunk.find(u'\uFFFD'), UTF16String::npos);
+}
+
+TEST(UTF16OutputStream, LongTextOverflowsTheBufferIntoTheSink) {
+  RecordingSink sink;
+  {
+    UTF16OutputStream out(&sink);
+    for (int i = 0; i < 1000; ++i) out << "é";
+  }  // destruction flushes the rest
+  EXPECT_EQ(sink.all, UTF16String(1000, u'é'));
+  EXPECT_GT(sink.chunks.size(), 1u);
+}
+
+TEST(UTF16OutputStream, WithoutASinkTextIsDroppedAndASinkCanBeSetLater) {
+  UTF16OutputStream out;
+  out << "lost" << std::flush;
+  RecordingSink sink;
+  out.SetSink(&sink);
+  EXPECT_EQ(out.GetSink(), &sink);
+  out << "kept" << std::flush;
+  EXPECT_EQ(sink.all, u"kept");
+  out.SetSink(nullptr);
+}
