@@ -1,0 +1,211 @@
+// Keyboard events: their three forms, the shortcut character as the keyboard
+// layout gives it, the code that shortcuts compare, and the removal of the
+// system character message after an Alt shortcut.
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "support/ui/FakeInputPlatform.h"
+#include "ui/KeyboardEvent.h"
+
+namespace norvik::ui {
+namespace {
+
+using test::FakeInputPlatform;
+using test::FakeKeyboardLayout;
+
+KeyboardEvent KeyDown(short inOSCode, unsigned short inCharacter, ModifierKeys inMods = {}) {
+  return KeyboardEvent(KeyboardEvent::kActionKeyDown, inCharacter, inOSCode, inMods, false,
+                       OS_Event(1, kOSMsgKeyDown, static_cast<std::uintptr_t>(inOSCode), 0));
+}
+
+TEST(KeyboardEventForms, KeyFormKeepsItsFieldsAndCleansTheCharacter) {
+  OS_Event os(5, kOSMsgKeyUp, 13, 0x1C0001, 99);
+  KeyboardEvent e(KeyboardEvent::kActionKeyUp, 13, 13, ModifierKeys(kModKeyCtrl), true, os);
+  EXPECT_EQ(e.GetAction(), KeyboardEvent::kActionKeyUp);
+  EXPECT_TRUE(e.IsActionKeyUp());
+  EXPECT_FALSE(e.IsActionKeyDown());
+  EXPECT_EQ(e.GetNumCharacters(), 1u);
+  EXPECT_EQ(e.GetCharacter(0), 0);
+  EXPECT_EQ(e.GetOSCode(), 13);
+  EXPECT_EQ(e.GetModKey(), ModifierKeys(kModKeyCtrl));
+  EXPECT_TRUE(e.IsRepeat());
+  EXPECT_EQ(e.GetOSEvent().GetTime(), 99);
+}
+
+TEST(KeyboardEventForms, CharacterFormIsACharActionWithNoKey) {
+  KeyboardEvent e(std::vector<unsigned short>{'h', 'i', 9}, ModifierKeys(kModKeyShift), false, OS_Event());
+  EXPECT_TRUE(e.IsActionKeyChar());
+  EXPECT_EQ(e.GetOSCode(), -1);
+  ASSERT_EQ(e.GetNumCharacters(), 3u);
+  EXPECT_EQ(e.GetCharacter(1), 'i');
+  EXPECT_EQ(e.GetCharacter(2), 0);
+  EXPECT_EQ(e.GetCharacter(3), 0) << "past the end reads as 0";
+}
+
+TEST(KeyboardEventForms, CharacterFormWithNoCharactersStillHasOne) {
+  KeyboardEvent e(std::vector<unsigned short>{}, {}, false, OS_Event());
+  EXPECT_EQ(e.GetNumCharacters(), 1u);
+  EXPECT_EQ(e.GetCharacter(0), 0);
+}
+
+TEST(KeyboardEventForms, NativeOnlyFormHasNoActionNoCharacterAndNoModifiers) {
+  KeyboardEvent e(OS_Event(3, kOSMsgDeadChar, 0, 0));
+  EXPECT_EQ(e.GetAction(), KeyboardEvent::kActionNone);
+  EXPECT_FALSE(e.IsActionKeyDown() || e.IsActionKeyUp() || e.IsActionKeyChar() || e.IsActionKeyDeadChar());
+  EXPECT_EQ(e.GetNumCharacters(), 1u);
+  EXPECT_EQ(e.GetCharacter(0), 0);
+  EXPECT_EQ(e.GetOSCode(), -1);
+  EXPECT_TRUE(e.GetModKey().IsEmpty());
+  EXPECT_EQ(e.GetOSEvent().GetMsg(), kOSMsgDeadChar);
+}
+
+TEST(ShortcutCharacter, LettersOfTheUSLayoutComeOutUpperCase) {
+  EXPECT_EQ(KeyDown('Q', 'q').GetShortcutCharacter(), 'Q');
+  EXPECT_EQ(KeyDown('Q', 0).GetShortcutCharacter(), 0) << "character 0 is its own result";
+}
+
+TEST(ShortcutCharacter, KeysTypingOtherCharactersMapThroughTheLayout) {
+  // Shift+1 types '!', but the shortcut sees the key's own character.
+  EXPECT_EQ(KeyDown('1', '!', ModifierKeys(kModKeyShift)).GetShortcutCharacter(), '1');
+  EXPECT_EQ(KeyDown(191, '?').GetShortcutCharacter(), '/');
+  EXPECT_EQ(KeyDown(-111, '/').GetShortcutCharacter(), '/') << "the extended sign is not part of the key";
+}
+
+TEST(ShortcutCharacter, SomeLetterKeysKeepTheirTypedCharacter) {
+  // These keys are taken as typed, without asking the layout and without case change.
+  EXPECT_EQ(KeyDown('C', 'c').GetShortcutCharacter(), 'c');
+  EXPECT_EQ(KeyDown('V', 'v').GetShortcutCharacter(), 'v');
+  EXPECT_EQ(KeyDown(91, 'x').GetShortcutCharacter(), 'x');
+  EXPECT_EQ(KeyDown('B', 'b').GetShortcutCharacter(), 'B');
+}
+
+TEST(ShortcutCharacter, WithoutAKeyTheCharactersKeyIsLookedUp) {
+  KeyboardEvent e(KeyboardEvent::kActionKeyChar, '@', 0, ModifierKeys(kModKeyShift), false, OS_Event());
+  EXPECT_EQ(e.GetShortcutCharacter(), '2');
+  KeyboardEvent lower(KeyboardEvent::kActionKeyChar, 'k', 0, {}, false, OS_Event());
+  EXPECT_EQ(lower.GetShortcutCharacter(), 'K');
+}
+
+TEST(ShortcutCharacter, ACharacterNoKeyTypesStaysAsTyped) {
+  KeyboardEvent e(KeyboardEvent::kActionKeyChar, 0x00E9, 0, {}, false, OS_Event());
+  EXPECT_EQ(e.GetShortcutCharacter(), 0x00E9);
+}
+
+TEST(ShortcutCharacter, UsesTheActiveLayoutWhenItsCodePageIsSupported) {
+  FakeKeyboardLayout german(1031, 1252);
+  german.AddKey(186, 0x00FC);  // u with diaeresis, lower case
+  EXPECT_EQ(KeyDown(186, 0x00FC).GetShortcutCharacter(), 0x00DC);
+  ASSERT_FALSE(german.mLayoutsAsked.empty());
+  EXPECT_EQ(german.mLayoutsAsked.back(), 1031u);
+}
+
+TEST(ShortcutCharacter, FallsBackToUSEnglishForOtherCodePages) {
+  FakeKeyboardLayout russian(1049, 1251);
+  russian.AddKey('D', 0x0432);
+  EXPECT_EQ(KeyDown('D', 0x0432).GetShortcutCharacter(), 'D');
+  ASSERT_FALSE(russian.mLayoutsAsked.empty());
+  EXPECT_EQ(russian.mLayoutsAsked.back(), 1033u);
+}
+
+TEST(ShortcutCharacter, IsComputedOnceAndKeptInTheEvent) {
+  KeyboardEvent e = [] {
+    FakeKeyboardLayout greek(1032, 1253);
+    return KeyDown('D', 0x03B4);
+  }();
+  {
+    FakeKeyboardLayout czech(1029, 1250);
+    czech.AddKey('D', 0x010F);  // d with caron
+    EXPECT_EQ(e.GetShortcutCharacter(), 0x010E);
+  }
+  // The layout is gone; the event answers from its cache.
+  EXPECT_EQ(e.GetShortcutCharacter(), 0x010E);
+  EXPECT_EQ(e.GetCode().GetCharacter(), 0x010E);
+}
+
+TEST(KeyCode, ControlKeysGiveTheirControlCode) {
+  EXPECT_EQ(KeyDown(27, 27).GetCode(), KeyboardCode::CreateFromControlCode(kControlCodeEscape));
+  EXPECT_EQ(KeyDown(115, 0).GetCode(), KeyboardCode::CreateFromControlCode(kControlCodeF1 + 3));
+}
+
+TEST(KeyCode, KeypadNavigationKeysCarryTheExtendedBit) {
+  KeyboardCode keypadHome = KeyDown(36, 0).GetCode();
+  KeyboardCode blockHome = KeyDown(-36, 0).GetCode();
+  EXPECT_TRUE(keypadHome.IsExtended());
+  EXPECT_FALSE(blockHome.IsExtended());
+  EXPECT_EQ(keypadHome.GetControlCode(), kControlCodeHome);
+  EXPECT_EQ(keypadHome.GetValue(false), blockHome.GetValue(false));
+}
+
+TEST(KeyCode, PrintableKeysGiveTheirShortcutCharacter) {
+  KeyboardCode q = KeyDown('Q', 'q').GetCode();
+  EXPECT_TRUE(q.IsPrintable());
+  EXPECT_EQ(q.GetCharacter(), 'Q');
+  KeyboardCode keypad5 = KeyDown(101, '5').GetCode();
+  EXPECT_TRUE(keypad5.IsPrintable());
+  EXPECT_TRUE(keypad5.IsExtended());
+  EXPECT_EQ(keypad5.GetCharacter(), '5');
+}
+
+TEST(KeyCode, AKeyWithNeitherCharacterNorControlCodeHasNoCodeAndMatchesNothing) {
+  KeyboardEvent e = KeyDown(200, 0);
+  EXPECT_EQ(e.GetCode().GetValue(), 65535u);
+  EXPECT_FALSE(e.CompareCode(KeyboardCode()));
+  EXPECT_FALSE(e.CompareShortcut(KeyboardCode(), {}));
+  EXPECT_FALSE(e.CompareShortcut(KeyboardCode(65535), {}));
+}
+
+TEST(KeyCode, AnEventWithoutAKeyReadsAsClear) {
+  // -1 is both "no key" and the extended Clear key.
+  KeyboardEvent e(std::vector<unsigned short>{'a'}, {}, false, OS_Event());
+  EXPECT_EQ(e.GetCode().GetControlCode(), kControlCodeClear);
+}
+
+TEST(ShortcutMatching, ModifiersMustMatchExactlyWithCapsLockIgnored) {
+  KeyboardCode s = KeyboardCode::CreateFromKeyboardChar('S');
+  // Key-down events carry the key's upper-case character, as the platform's translation gives it.
+  KeyboardEvent ctrlS = KeyDown('S', 'S', ModifierKeys(kModKeyCtrl | kModKeyCapsLock));
+  EXPECT_TRUE(ctrlS.CompareShortcut(s, ModifierKeys(kModKeyCtrl)));
+  EXPECT_FALSE(ctrlS.CompareShortcut(s, ModifierKeys(kModKeyCtrl | kModKeyCapsLock)));
+  EXPECT_FALSE(ctrlS.CompareShortcut(s, ModifierKeys(kModKeyCtrl | kModKeyShift)));
+  EXPECT_FALSE(ctrlS.CompareShortcut(s, {}));
+  EXPECT_TRUE(ctrlS.CompareCode(s));
+  EXPECT_FALSE(ctrlS.CompareCode(KeyboardCode::CreateFromKeyboardChar('D')));
+}
+
+TEST(PostActionFlush, ASystemKeyRemovesOnePendingSystemCharacterOfItsWindow) {
+  FakeInputPlatform platform;
+  platform.PostMessage(1, kOSMsgSysChar);
+  platform.PostMessage(2, kOSMsgSysChar);
+  platform.PostMessage(1, kOSMsgSysChar);
+  KeyboardEvent altF(KeyboardEvent::kActionKeyDown, 'F', 'F', ModifierKeys(kModKeyAlt), false,
+                     OS_Event(1, kOSMsgSysKeyDown, 'F', 0));
+  FlushPostActionKeyEvents(altF);
+  EXPECT_EQ(platform.GetQueue(), (std::vector<std::pair<OS_WindowHandle, unsigned>>{{2, kOSMsgSysChar},
+                                                                                     {1, kOSMsgSysChar}}));
+  KeyboardEvent altUp(KeyboardEvent::kActionKeyUp, 'F', 'F', ModifierKeys(kModKeyAlt), false,
+                      OS_Event(2, kOSMsgSysKeyUp, 'F', 0));
+  FlushPostActionKeyEvents(altUp);
+  EXPECT_EQ(platform.GetQueue(), (std::vector<std::pair<OS_WindowHandle, unsigned>>{{1, kOSMsgSysChar}}));
+}
+
+TEST(PostActionFlush, OrdinaryKeysLeaveTheQueueAlone) {
+  FakeInputPlatform platform;
+  platform.PostMessage(1, kOSMsgSysChar);
+  platform.PostMessage(1, kOSMsgChar);
+  FlushPostActionKeyEvents(KeyDown('F', 'f'));
+  FlushPostActionKeyEvents(KeyboardEvent(OS_Event(1, kOSMsgSysChar, 'f', 0)));
+  EXPECT_EQ(platform.GetQueue().size(), 2u);
+}
+
+TEST(ModifierState, ComesFromTheInstalledPlatform) {
+  EXPECT_TRUE(utility::GetCurrentModKeys().IsEmpty()) << "the quiet platform holds no keys";
+  FakeInputPlatform platform;
+  platform.mRecentModKeys = ModifierKeys(kModKeyShift);
+  platform.mCurrentModKeys = ModifierKeys(kModKeyAlt | kModKeyCapsLock);
+  EXPECT_EQ(utility::GetRecentEventModKeys(), ModifierKeys(kModKeyShift));
+  EXPECT_EQ(utility::GetCurrentModKeys(), ModifierKeys(kModKeyAlt | kModKeyCapsLock));
+}
+
+}  // namespace
+}  // namespace norvik::ui

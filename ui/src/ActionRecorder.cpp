@@ -1,0 +1,16 @@
+#include "ui/ActionRecorder.h"
+
+namespace norvik::automateui {
+
+ActionRecorder& ActionRecorder::GetInstance() {
+  static ActionRecorder sInstance;
+  return sInstance;
+}
+
+bool ActionRecorder::IsRecording() const { return false; }
+
+void ActionRecorder::RecordMouseEvent(ui::UI_Node*, const ui::MouseEvent&) {}
+
+void ActionRecorder::RecordKeyboardEvent(ui::UI_Node*, const ui::KeyboardEvent&) {}
+
+}  // namespace norvik::automateui
