@@ -1,0 +1,77 @@
+// Resources compiled into the library, and functions found by name.
+#include <gtest/gtest.h>
+
+#include <dlfcn.h>
+
+#include <cmath>
+#include <cstring>
+#include <string>
+
+#include "tarsel/ModuleResources.h"
+#include "tarsel/PropListUtils.h"
+
+using namespace tarsel::resources;
+
+TEST(ModuleResourceTests, AnEmbeddedDocumentIsFoundByNameAndType) {
+  std::vector<unsigned char> buffer;
+  ASSERT_TRUE(GetBinaryFromModule(kThisModule, "ExamplePropList", "XML", buffer));
+  const std::string text(buffer.begin(), buffer.end());
+  EXPECT_EQ(0u, text.find("<?xml version='1.0'?>\r\n"));
+  EXPECT_TRUE(ModuleHasBinary(kThisModule, "ExamplePropList", "XML"));
+}
+
+TEST(ModuleResourceTests, NamesAndTypesCompareWithoutCase) {
+  EXPECT_TRUE(ModuleHasBinary(kThisModule, "exampleproplist", "xml"));
+  EXPECT_TRUE(ModuleHasBinary(kThisModule, "EXAMPLEPROPLIST", "Xml"));
+  EXPECT_FALSE(ModuleHasBinary(kThisModule, "ExamplePropList", "PNG")) << "the type must match too";
+  EXPECT_FALSE(ModuleHasBinary(kThisModule, "ExamplePropLis", "XML")) << "a prefix is not the name";
+  EXPECT_FALSE(ModuleHasBinary(kThisModule, "", ""));
+}
+
+TEST(ModuleResourceTests, AMissingResourceLeavesTheBufferAlone) {
+  std::vector<unsigned char> buffer{1, 2, 3};
+  EXPECT_FALSE(GetBinaryFromModule(kThisModule, "NoSuchResource", "XML", buffer));
+  EXPECT_EQ((std::vector<unsigned char>{1, 2, 3}), buffer);
+}
+
+TEST(ModuleResourceTests, TheEmbeddedDocumentIsExactlyWhatTheWriterProduces) {
+  std::vector<unsigned char> buffer;
+  ASSERT_TRUE(GetBinaryFromModule(kThisModule, "ExamplePropList", "xml", buffer));
+  const std::string text(buffer.begin(), buffer.end());
+  tarsel::proplist::PropList list;
+  tarsel::proplist::utils::ReadPropList(text, list);
+  UTF16String title;
+  ASSERT_TRUE(list.GetValue("Title", title));
+  EXPECT_EQ(u"Exemple d'\u00e9t\u00e9", title);
+  tarsel::geom::PointT<long> origin;
+  ASSERT_TRUE(tarsel::proplist::utils::ReadPoint32(list, "Origin", origin));
+  EXPECT_EQ(tarsel::geom::PointT<long>(12, -7), origin);
+  const UTF8String written = tarsel::proplist::utils::WritePropList(list);
+  EXPECT_EQ(text, std::string(written.data(), written.size()));
+}
+
+TEST(ModuleResourceTests, AModuleWithoutEmbeddedResourcesHasNone) {
+  void* libm = ::dlopen("libm.so.6", RTLD_NOW | RTLD_LOCAL);
+  ASSERT_NE(nullptr, libm);
+  std::vector<unsigned char> buffer;
+  EXPECT_FALSE(ModuleHasBinary(libm, "ExamplePropList", "XML"));
+  EXPECT_FALSE(GetBinaryFromModule(libm, "ExamplePropList", "XML", buffer));
+  ::dlclose(libm);
+}
+
+TEST(ModuleResourceTests, FunctionsAreFoundByNameInAModuleOrInTheProcess) {
+  void* libm = ::dlopen("libm.so.6", RTLD_NOW | RTLD_LOCAL);
+  ASSERT_NE(nullptr, libm);
+  using Unary = double (*)(double);
+  Unary cosine = GetFunctionPointerFromModule<Unary>(libm, "cos");
+  ASSERT_NE(nullptr, cosine);
+  EXPECT_DOUBLE_EQ(1.0, cosine(0.0));
+  EXPECT_EQ(nullptr, GetFunctionPointerFromModuleImpl(libm, "no_such_function_here"));
+  ::dlclose(libm);
+
+  using Length = std::size_t (*)(const char*);
+  Length length = GetFunctionPointerFromModule<Length>(kThisModule, "strlen");
+  ASSERT_NE(nullptr, length);
+  EXPECT_EQ(5u, length("hello"));
+  EXPECT_EQ(nullptr, GetFunctionPointerFromModuleImpl(kThisModule, nullptr));
+}
