@@ -1,0 +1,130 @@
+// Rounding and half-pixel rules of the image back end, read back from pixels.
+#include <gtest/gtest.h>
+
+#include "drawbot/DrawHelpers.h"
+#include "support/drawbot/PixelCompare.h"
+
+namespace norvik::drawbot {
+namespace {
+
+using testing::ColumnCoverage;
+using testing::PixelCanvas;
+using testing::RowCoverage;
+using tarsel::geom::PointT;
+using tarsel::geom::RectT;
+
+const ColorRGBA kBlack(0, 0, 0, 1);
+
+TEST(HalfPixelRules, AWholeNumberRectangleWithAntiAliasingOffFillsExactlyItsPixels) {
+  PixelCanvas canvas(12, 4);
+  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2, 1, 5, 2));
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(RowCoverage(image, 0), "............");
+  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
+  EXPECT_EQ(RowCoverage(image, 2), "..#####.....");
+  EXPECT_EQ(RowCoverage(image, 3), "............");
+  EXPECT_EQ(image.At(2, 1), 0xff000000u);
+}
+
+TEST(HalfPixelRules, AFractionalRectangleIsWidenedToWholePixelsOutward) {
+  PixelCanvas canvas(12, 4);
+  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2.5f, 1.25f, 4.0f, 1.5f));
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
+  EXPECT_EQ(RowCoverage(image, 2), "..#####.....");
+  // Painted rectangles stay crisp: the edges are fully covered, not blended.
+  EXPECT_EQ(image.Alpha(2, 1), 255);
+  EXPECT_EQ(image.Alpha(6, 2), 255);
+}
+
+TEST(HalfPixelRules, AnAntiAliasedWholeNumberRectangleStaysCrisp) {
+  PixelCanvas canvas(12, 4);
+  canvas.GetSurface()->SetAntiAliasPolicy(kAntiAlias);
+  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2, 1, 5, 2));
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
+  EXPECT_EQ(image.Alpha(6, 1), 255);
+}
+
+TEST(HalfPixelRules, AOnePixelLineOnWholePixelsLightsExactlyOneRowWithAntiAliasingOff) {
+  PixelCanvas canvas(12, 10);
+  PathP path(canvas.GetSupplier());
+  path->MoveTo(PointT<long>(2, 5));
+  path->LineTo(PointT<long>(9, 5));
+  PenP pen(canvas.GetSupplier(), kBlack, 1);
+  canvas.GetSurface()->StrokePath(*pen, *path);
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(RowCoverage(image, 4), "............");
+  EXPECT_EQ(RowCoverage(image, 5).substr(0, 2), "..");
+  EXPECT_EQ(image.Alpha(5, 5), 255);
+  EXPECT_EQ(RowCoverage(image, 6), "............");
+}
+
+TEST(HalfPixelRules, AnAntiAliasedLineAtAWholeNumberStraddlesTwoRowsAtHalfStrength) {
+  PixelCanvas canvas(12, 10);
+  canvas.GetSurface()->SetAntiAliasPolicy(kAntiAlias);
+  PathP path(canvas.GetSupplier());
+  path->MoveTo(PointT<long>(2, 5));
+  path->LineTo(PointT<long>(9, 5));
+  PenP pen(canvas.GetSupplier(), kBlack, 1);
+  canvas.GetSurface()->StrokePath(*pen, *path);
+  auto image = canvas.Snapshot();
+  EXPECT_NEAR(image.Alpha(5, 4), 128, 2);
+  EXPECT_NEAR(image.Alpha(5, 5), 128, 2);
+}
+
+TEST(HalfPixelRules, AFloatPathIsShiftedEvenWithAntiAliasingOff) {
+  // The same line through float points is no longer pixel aligned, so it is
+  // drawn in the shifted frame, half a pixel away from the aligned row.
+  PixelCanvas aligned(12, 10), shifted(12, 10);
+  PenP pen(aligned.GetSupplier(), kBlack, 1);
+  PathP a(aligned.GetSupplier()), f(aligned.GetSupplier());
+  a->MoveTo(PointT<long>(2, 5));
+  a->LineTo(PointT<long>(9, 5));
+  f->MoveTo(PointT<float>(2, 5));
+  f->LineTo(PointT<float>(9, 5));
+  aligned.GetSurface()->StrokePath(*pen, *a);
+  shifted.GetSurface()->StrokePath(*pen, *f);
+  EXPECT_EQ(ColumnCoverage(aligned.Snapshot(), 5), ".....#....");
+  EXPECT_EQ(ColumnCoverage(shifted.Snapshot(), 5), "....#.....");
+}
+
+TEST(HalfPixelRules, StrokeRectOutlinesTheRectangleIncludingItsFarEdge) {
+  PixelCanvas canvas(10, 10);
+  Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  canvas.GetSurface()->SetAntiAliasPolicy(kAntiAlias);
+  StrokeRect(drawbot, RectT<long>(1, 1, 6, 6), kBlack, 1);
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(RowCoverage(image, 1), ".#######..");
+  EXPECT_EQ(RowCoverage(image, 3), ".#.....#..");
+  EXPECT_EQ(RowCoverage(image, 7), ".#######..");
+  EXPECT_EQ(image.Alpha(1, 3), 255);
+  // StrokeRect turned anti-aliasing off only inside its own state.
+  EXPECT_EQ(canvas.GetSurface()->GetAntiAliasPolicy(), kAntiAlias);
+}
+
+TEST(HalfPixelRules, ShapesMatchTheirReferenceImage) {
+  PixelCanvas canvas(48, 32);
+  canvas.Clear(0xffffff);
+  SurfaceInterface* surface = canvas.GetSurface();
+  SupplierInterface const* supplier = canvas.GetSupplier();
+  surface->PaintRect(ColorRGBA(0.2f, 0.4f, 0.8f, 1), RectT<float>(2, 2, 10, 8));
+  surface->SetAntiAliasPolicy(kAntiAlias);
+  PathP ellipse;
+  GetEllipsePath(supplier, RectT<float>(16, 2, 14, 10), &ellipse);
+  BrushP red(supplier, ColorRGBA(0.9f, 0.1f, 0.1f, 1));
+  surface->FillPath(*red, *ellipse, kFillWinding);
+  PathP rounded;
+  GetRoundedRectPath(supplier, RectT<float>(4, 14, 26, 14), 5, &rounded);
+  PenP green(supplier, ColorRGBA(0.1f, 0.6f, 0.2f, 1), 2);
+  surface->StrokePath(*green, *rounded);
+  PathP arc(supplier);
+  arc->MoveTo(PointT<float>(36, 24));
+  arc->AddArc(PointT<float>(40, 16), 6, 180, 270);
+  PenP black(supplier, kBlack, 1.5f);
+  surface->StrokePath(*black, *arc);
+  EXPECT_TRUE(testing::MatchesReference(canvas.Snapshot(), "drawbot/shapes"));
+}
+
+}  // namespace
+}  // namespace norvik::drawbot
