@@ -1,0 +1,167 @@
+// Messages and notification lists: order, skipped and emptied entries, and
+// callbacks that change the list or destroy its owner while it fires.
+#include <memory>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "ui/MessageT.h"
+
+namespace norvik::ui {
+namespace {
+
+struct Subject {
+  int value = 0;
+};
+
+class ValueChangedMessage : public MessageT<Subject> {
+ public:
+  ValueChangedMessage(Subject* inSubject, int inOld) : MessageT<Subject>(inSubject), mOld(inOld) {}
+  int mOld;
+};
+
+TEST(MessageT, CarriesItsSubjectAndCanBeRetargeted) {
+  Subject a, b;
+  ValueChangedMessage message(&a, 3);
+  MessageT<Subject>& base = message;
+  EXPECT_EQ(base.GetSubject(), &a);
+  base.SetSubject(&b);
+  EXPECT_EQ(message.GetSubject(), &b);
+  EXPECT_EQ(dynamic_cast<ValueChangedMessage&>(base).mOld, 3);
+}
+
+TEST(MessageT, DefaultsToNoSubject) {
+  MessageT<const Subject> message;
+  EXPECT_EQ(message.GetSubject(), nullptr);
+}
+
+TEST(NotificationList, FiresEntriesInInstallationOrderWithTheArguments) {
+  NotificationList<void(int, const std::string&)> list;
+  std::vector<std::string> calls;
+  list.Install(MakeNotification<void(int, const std::string&)>(
+      [&](int n, const std::string& s) { calls.push_back("a" + std::to_string(n) + s); }));
+  list.Install(MakeNotification<void(int, const std::string&)>(
+      [&](int n, const std::string& s) { calls.push_back("b" + std::to_string(n) + s); }));
+  list.Notify(7, std::string("x"));
+  EXPECT_EQ(calls, (std::vector<std::string>{"a7x", "b7x"}));
+}
+
+TEST(NotificationList, SkipsAnEntryWhosePointerIsNull) {
+  NotificationList<void()> list;
+  int calls = 0;
+  list.Install(nullptr);
+  list.Install(MakeNotification<void()>([&] { ++calls; }));
+  EXPECT_NO_THROW(list.Notify());
+  EXPECT_EQ(calls, 1);
+  EXPECT_EQ(list.size(), 2u);
+}
+
+TEST(NotificationList, AnEntryEmptiedByItsOwnerThrowsTheStandardErrorAfterEarlierEntriesRan) {
+  NotificationList<void()> list;
+  std::vector<int> calls;
+  list.Install(MakeNotification<void()>([&] { calls.push_back(1); }));
+  auto kept = MakeNotification<void()>([&] { calls.push_back(2); });
+  list.Install(kept);
+  list.Install(MakeNotification<void()>([&] { calls.push_back(3); }));
+
+  list.Notify();
+  EXPECT_EQ(calls, (std::vector<int>{1, 2, 3}));
+
+  kept->clear();
+  calls.clear();
+  try {
+    list.Notify();
+    FAIL() << "an empty function was called without error";
+  } catch (const boost::bad_function_call& error) {
+    EXPECT_STREQ(error.what(), "call to empty boost::function");
+  }
+  EXPECT_EQ(calls, (std::vector<int>{1}));
+}
+
+TEST(NotificationList, AnOwnerTurnsItsEntryOffByReplacingItsFunction) {
+  NotificationList<void()> list;
+  int calls = 0;
+  auto kept = MakeNotification<void()>([&] { ++calls; });
+  list.Install(kept);
+  *kept = [] {};
+  list.Notify();
+  EXPECT_EQ(calls, 0);
+}
+
+TEST(NotificationList, UntilTrueStopsAtTheFirstTrueAnswer) {
+  NotificationList<bool(long)> list;
+  std::vector<int> calls;
+  list.Install(MakeNotification<bool(long)>([&](long) { calls.push_back(1); return false; }));
+  list.Install(MakeNotification<bool(long)>([&](long id) { calls.push_back(2); return id == 5; }));
+  list.Install(MakeNotification<bool(long)>([&](long) { calls.push_back(3); return true; }));
+  EXPECT_TRUE(list.NotifyUntilTrue(5L));
+  EXPECT_EQ(calls, (std::vector<int>{1, 2}));
+  calls.clear();
+  EXPECT_TRUE(list.NotifyUntilTrue(6L));
+  EXPECT_EQ(calls, (std::vector<int>{1, 2, 3}));
+}
+
+TEST(NotificationList, UntilTrueAnswersFalseForAnEmptyListOrWhenNobodyAnswersTrue) {
+  NotificationList<bool()> list;
+  EXPECT_FALSE(list.NotifyUntilTrue());
+  list.Install(MakeNotification<bool()>([] { return false; }));
+  list.Install(nullptr);
+  EXPECT_FALSE(list.NotifyUntilTrue());
+}
+
+TEST(NotificationList, AnEntryInstalledWhileFiringIsCalledFromTheNextPassOn) {
+  NotificationList<void()> list;
+  int late = 0;
+  bool installed = false;
+  list.Install(MakeNotification<void()>([&] {
+    if (installed) return;
+    installed = true;
+    list.Install(MakeNotification<void()>([&] { ++late; }));
+  }));
+  list.Notify();
+  EXPECT_EQ(late, 0);
+  list.Notify();
+  EXPECT_EQ(late, 1);
+}
+
+TEST(NotificationList, SurvivesACallbackThatDestroysTheListsOwner) {
+  struct Owner {
+    NotificationList<void()> changed;
+  };
+  auto owner = std::make_unique<Owner>();
+  std::vector<int> calls;
+  owner->changed.Install(MakeNotification<void()>([&] {
+    calls.push_back(1);
+    owner.reset();
+  }));
+  owner->changed.Install(MakeNotification<void()>([&] { calls.push_back(2); }));
+  Owner* raw = owner.get();
+  raw->changed.Notify();
+  EXPECT_EQ(owner, nullptr);
+  EXPECT_EQ(calls, (std::vector<int>{1, 2}));
+}
+
+TEST(NotifyAll, WorksOnAPlainVectorOfSharedFunctions) {
+  std::vector<boost::shared_ptr<boost::function<void(int&)>>> list;
+  list.push_back(MakeNotification<void(int&)>([](int& n) { n += 1; }));
+  list.push_back(nullptr);
+  list.push_back(MakeNotification<void(int&)>([](int& n) { n *= 10; }));
+  int value = 2;
+  NotifyAll(list, value);
+  EXPECT_EQ(value, 30);
+}
+
+TEST(NotificationList, ClearDropsEveryEntry) {
+  NotificationList<void()> list;
+  int calls = 0;
+  list.Install(MakeNotification<void()>([&] { ++calls; }));
+  list.Clear();
+  list.Notify();
+  EXPECT_TRUE(list.empty());
+  EXPECT_EQ(calls, 0);
+}
+
+}  // namespace
+}  // namespace norvik::ui

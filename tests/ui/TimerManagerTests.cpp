@@ -1,0 +1,153 @@
+// The timer manager on its own: records made by its factory, keys, removal by
+// id from a node's key list, and the end of every record with the manager.
+#include <cmath>
+#include <list>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "ui/UI_NodeTimerManager.h"
+
+namespace norvik::ui {
+namespace {
+
+// Nodes are only identities to the manager; two distinct addresses do.
+int gNodeA, gNodeB;
+UI_Node* const kNodeA = reinterpret_cast<UI_Node*>(&gNodeA);
+UI_Node* const kNodeB = reinterpret_cast<UI_Node*>(&gNodeB);
+
+// A record that reports its own end, as a native timer record kills its timer.
+class TrackedTimerData : public UI_NodeTimerData {
+ public:
+  TrackedTimerData(UI_Node* inNode, long inID, float inSeconds, std::vector<long>* ioKilled)
+      : UI_NodeTimerData(inNode, inID, inSeconds), mKilled(ioKilled) {}
+  ~TrackedTimerData() override { mKilled->push_back(GetTimerID()); }
+
+ private:
+  std::vector<long>* mKilled;
+};
+
+class TimerManagerTest : public ::testing::Test {
+ protected:
+  UI_NodeTimerManager::Factory TrackingFactory() {
+    return [this](UI_Node* node, long id, float seconds) {
+      ++mCreated;
+      return UI_NodeTimerDataP(new TrackedTimerData(node, id, seconds, &mKilled));
+    };
+  }
+
+  std::vector<long> mKilled;
+  int mCreated = 0;
+};
+
+TEST_F(TimerManagerTest, CreatedTimerIsFoundUnderItsRecordsAddress) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  const auto key = manager.CreateTimer(kNodeB, 42, 0.25f);
+  UI_NodeTimerData* data = manager.GetTimerData(key);
+  ASSERT_NE(data, nullptr);
+  EXPECT_EQ(UI_NodeTimerManager::KeyOf(data), key);
+  EXPECT_EQ(data->GetNode(), kNodeB);
+  EXPECT_EQ(data->GetTimerID(), 42);
+  EXPECT_FLOAT_EQ(data->GetSeconds(), 0.25f);
+  EXPECT_EQ(mCreated, 1);
+  EXPECT_EQ(manager.GetManagerNode(), kNodeA);
+  EXPECT_NE(manager.GetTimerDataIter(key), manager.End());
+}
+
+TEST_F(TimerManagerTest, UnknownKeyHasNoRecord) {
+  UI_NodeTimerManager manager(kNodeA);
+  EXPECT_EQ(manager.GetTimerData(12345), nullptr);
+  EXPECT_EQ(manager.GetTimerDataIter(12345), manager.End());
+}
+
+TEST_F(TimerManagerTest, WithoutAFactoryPlainRecordsAreMade) {
+  UI_NodeTimerManager manager(kNodeA);
+  const auto key = manager.CreateTimer(kNodeA, 3, 1.0f);
+  ASSERT_NE(manager.GetTimerData(key), nullptr);
+  EXPECT_EQ(manager.GetTimerData(key)->GetTimerID(), 3);
+}
+
+TEST_F(TimerManagerTest, AFactoryThatRefusesLeavesNoTimer) {
+  UI_NodeTimerManager manager(kNodeA, [](UI_Node*, long, float) { return UI_NodeTimerDataP(); });
+  const auto key = manager.CreateTimer(kNodeA, 3, 1.0f);
+  EXPECT_EQ(manager.GetTimerData(key), nullptr);
+  EXPECT_EQ(manager.GetTimerCount(), 0u);
+}
+
+TEST_F(TimerManagerTest, RemoveTimerDropsTheFirstMatchAndEveryCopyOfItsKey) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  std::list<long> keys;
+  const auto k1 = manager.CreateTimer(kNodeA, 1, 0.1f);
+  const auto k2 = manager.CreateTimer(kNodeA, 2, 0.1f);
+  keys = {k1, k2, k1};
+  EXPECT_TRUE(manager.RemoveTimer(kNodeA, 1, keys));
+  EXPECT_EQ(keys, (std::list<long>{k2}));
+  EXPECT_EQ(manager.GetTimerData(k1), nullptr);
+  EXPECT_NE(manager.GetTimerData(k2), nullptr);
+  EXPECT_EQ(mKilled, (std::vector<long>{1}));
+}
+
+TEST_F(TimerManagerTest, RemoveTimerAnswersFalseWhenNoKeyCarriesTheID) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  std::vector<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f)};
+  EXPECT_FALSE(manager.RemoveTimer(kNodeA, 9, keys));
+  EXPECT_EQ(keys.size(), 1u);
+  EXPECT_TRUE(mKilled.empty());
+}
+
+TEST_F(TimerManagerTest, RemoveTimerPassesOverKeysWhoseRecordIsAlreadyGone) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  std::vector<long> stale{manager.CreateTimer(kNodeA, 5, 0.1f)};
+  std::vector<long> keys = stale;
+  ASSERT_TRUE(manager.RemoveTimer(kNodeA, 5, stale));
+  const auto fresh = manager.CreateTimer(kNodeA, 5, 0.2f);
+  keys.push_back(fresh);
+  EXPECT_TRUE(manager.RemoveTimer(kNodeA, 5, keys));
+  EXPECT_EQ(manager.GetTimerData(fresh), nullptr);
+}
+
+TEST_F(TimerManagerTest, RemoveAllTimersEmptiesTheKeysAndEndsEachRecord) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  std::list<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f), manager.CreateTimer(kNodeA, 2, 0.1f)};
+  const auto other = manager.CreateTimer(kNodeB, 3, 0.1f);
+  manager.RemoveAllTimers(kNodeA, keys);
+  EXPECT_TRUE(keys.empty());
+  EXPECT_EQ(mKilled, (std::vector<long>{1, 2}));
+  EXPECT_NE(manager.GetTimerData(other), nullptr);
+}
+
+TEST_F(TimerManagerTest, ManagerEndsEveryRecordWhenItDies) {
+  {
+    UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+    manager.CreateTimer(kNodeA, 1, 0.1f);
+    manager.CreateTimer(kNodeB, 2, 0.1f);
+  }
+  EXPECT_EQ(mKilled.size(), 2u);
+}
+
+TEST_F(TimerManagerTest, ARecordKeptElsewhereOutlivesItsRemovalButIsNoLongerFound) {
+  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
+  std::vector<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f)};
+  UI_NodeTimerDataP held(manager.GetTimerData(keys.front()));
+  const auto key = keys.front();
+  manager.RemoveTimer(kNodeA, 1, keys);
+  EXPECT_TRUE(mKilled.empty());
+  EXPECT_EQ(manager.GetTimerData(key), nullptr);
+  held.reset();
+  EXPECT_EQ(mKilled, (std::vector<long>{1}));
+}
+
+TEST(UI_NodeTimerData, IntervalInMillisecondsIsTruncated) {
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 0.0159f).GetMilliseconds(), 15u);
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 2.0f).GetMilliseconds(), 2000u);
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 0.0f).GetMilliseconds(), 0u);
+}
+
+TEST(UI_NodeTimerData, NegativeOrNonNumberIntervalsBecomeZero) {
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, -1.0f).GetMilliseconds(), 0u);
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, std::nanf("")).GetMilliseconds(), 0u);
+  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 1e30f).GetMilliseconds(), 4294967295u);
+}
+
+}  // namespace
+}  // namespace norvik::ui
