@@ -113,6 +113,8 @@ TEST(JsonTests, MalformedTextRaisesTheToolkitExceptionWithAClearMessage) {
   EXPECT_NE(std::string::npos, message.find("cannot be read")) << message;
   EXPECT_NE(std::string::npos, message.find("line 1")) << message;
   EXPECT_EQ(std::string::npos, message.find("json.exception")) << message;
+  EXPECT_EQ("tarsel/serialization/Error/BadJSON", ParseErrorKey("[1e999]", &message));
+  EXPECT_NE(std::string::npos, message.find("1e999")) << message;
   for (const char* bad : {"", "{", "[1,]", "{\"a\" 1}", "01", "\"\\x\"", "[1] 2", "nul", "\"\xC3\x28\"", "1e999x"}) {
     EXPECT_EQ("tarsel/serialization/Error/BadJSON", ParseErrorKey(bad)) << bad;
   }
