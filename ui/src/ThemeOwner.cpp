@@ -1,0 +1,23 @@
+#include "ui/ThemeOwner.h"
+
+#include <boost/make_shared.hpp>
+
+namespace norvik::ui {
+
+ThemeOwner::ThemeOwner()
+    : mSharedSupplier(boost::make_shared<boost::function<ThemeP()>>([this] { return GetTheme(); })) {}
+
+ThemeOwner::~ThemeOwner() {
+  // Clients may still hold the shared supplier; after this owner is gone it
+  // must not call back into it.
+  if (mSharedSupplier) *mSharedSupplier = boost::function<ThemeP()>([] { return ThemeP(); });
+}
+
+void ThemeOwner::SetThemeName(const UTF16String& inName, bool) {
+  mThemeName = inName;
+  mThemeNameSet = true;
+}
+
+ThemeP ThemeOwner::GetTheme() const { return ThemeP(); }
+
+}  // namespace norvik::ui

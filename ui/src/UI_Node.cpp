@@ -1,0 +1,290 @@
+// UI_Node: construction, the tree, identity, callbacks, tool tips and placement.
+#include "ui/UI_Node.h"
+
+#include <cmath>
+
+#include "drawbot/CacheInterface.h"
+#include "tarsel/ThrowError.h"
+#include "ui/UI_NodeManager.h"
+
+namespace norvik::ui {
+
+UI_Node::UI_Node() {
+  SetAsANode(this);
+  UI_InvalidateDrawbotCache(false);
+}
+
+UI_Node::~UI_Node() {
+  if (UI_NodeManager* manager = UI_NodeManager::Get()) manager->ForgetNode(this);
+  // From here on the container half is no longer part of a node: the children
+  // it still holds are detached without handing anything to this node.
+  SetAsANode(nullptr);
+}
+
+// ---------------------------------------------------------------- tree walking
+
+UI_Node* UI_Node::UI_GetRootNode() {
+  UI_Node* node = this;
+  while (UI_Node* parent = node->UI_GetParentNode()) node = parent;
+  return node;
+}
+
+UI_Container* UI_Node::UI_GetRootContainer() {
+  UI_Container* container = this;
+  UI_Node* node = this;
+  while (node && node->mParent) {
+    container = node->mParent;
+    node = container->GetAsANode();
+  }
+  return container;
+}
+
+UI_Node* UI_Node::UI_GetParentEventRecipientNode() const {
+  for (UI_Node* p = UI_GetParentNode(); p; p = p->UI_GetParentNode()) {
+    if (p->UI_ReceivesEventsFromOS()) return p;
+  }
+  return nullptr;
+}
+
+std::vector<UI_Node*> UI_Node::UI_GetNodeParents() {
+  std::vector<UI_Node*> chain;
+  for (UI_Node* p = this; p; p = p->UI_GetParentNode()) chain.push_back(p);
+  return std::vector<UI_Node*>(chain.rbegin(), chain.rend());
+}
+
+bool UI_Node::UI_IsChildOf(const UI_Node& inNode) const {
+  for (const UI_Node* p = UI_GetParentNode(); p; p = p->UI_GetParentNode()) {
+    if (p == &inNode) return true;
+  }
+  return false;
+}
+
+bool UI_Node::UI_IsChild(const UI_NodeP& inNode) const { return inNode && inNode->UI_IsChildOf(*this); }
+
+UI_Container::iterator UI_Node::UI_ChildFindFromID(const UTF8String& inID) {
+  return std::find_if(mChildren.begin(), mChildren.end(),
+                      [&inID](const UI_NodeP& c) { return c->mNodeID == inID; });
+}
+
+UI_Node* UI_Node::UI_ChildGetFromID(const UTF8String& inID) {
+  auto it = UI_ChildFindFromID(inID);
+  return it == mChildren.end() ? nullptr : it->get();
+}
+
+void UI_Node::UI_SetParent(UI_Container* inParent) {
+  if (mParent) UI_ResetThemeSupplier();
+  mParent = inParent;
+  if (UI_Node* parentNode = inParent ? inParent->GetAsANode() : nullptr) {
+    UI_DispatchParentDisabledChange(false, parentNode->UI_IsDisabled());
+    return;
+  }
+  if (mStateFlags.Test(kStateParentDisabled)) {
+    UI_NodeProtector protect(this);
+    mStateFlags.Clear(kStateParentDisabled);
+    UI_DisabledStateChanged();
+    if (!mStateFlags.Test(kStateSelfDisabled)) {
+      const ChildList children(mChildren);
+      for (const UI_NodeP& child : children) child->UI_DispatchParentDisabledChange(false, false);
+    }
+  }
+}
+
+void UI_Node::ChildAdded(UI_Node* inChild) {
+  mTabOrderCache.clear();
+  UI_NodeP protect(inChild);
+  UI_Invalidate(nullptr, 0);
+  inChild->UI_SetThemeSupplier(IsActiveThemeOwner() ? GetSharedThemeSupplier() : UI_GetThemeSupplier());
+}
+
+void UI_Node::ChildRemoved(UI_Node* inChild) {
+  mTabOrderCache.clear();
+  UI_NodeP protect(inChild);
+  UI_Invalidate(nullptr, 0);
+  inChild->UI_ResetThemeSupplier();
+}
+
+void UI_Node::ChildOrderChanged() {
+  mTabOrderCache.clear();
+  UI_Invalidate(nullptr, 0);
+}
+
+ThemeP UI_Node::UI_DefaultThemeSupplier() const {
+  for (UI_Node* p = UI_GetParentNode(); p; p = p->UI_GetParentNode()) {
+    if (p->IsActiveThemeOwner() && p->HasThemeName()) return p->GetTheme();
+  }
+  return ThemeClient::UI_DefaultThemeSupplier();
+}
+
+void UI_Node::UI_DispatchNodeChange(NodeChange inChange) {
+  UI_NodeProtector protect(this);
+  UI_NodeChanged(inChange);
+  const ChildList children(mChildren);
+  for (const UI_NodeP& child : children) child->UI_DispatchNodeChange(inChange);
+}
+
+// ------------------------------------------------------------------- callbacks
+
+void UI_Node::NotifyFocusChanged(UI_Node* inNode, FocusChangeReason inReason) {
+  UI_NodeProtector protect(this);
+  UI_FireCallbackList(mFocusChangedFunctions, inNode, inReason);
+}
+
+void UI_Node::UI_FocusChanged(FocusChangeReason inReason) { NotifyFocusChanged(this, inReason); }
+
+void UI_Node::UI_NotifyBeforeFocusChangeWithOS(bool inGaining, FocusChangeReason inReason) {
+  UI_NodeProtector protect(this);
+  UI_FireCallbackList(mBeforeFocusChangeFunctions, inGaining, inReason);
+}
+
+void UI_Node::UI_SizeChanged(const RectF&) {
+  UI_NodeProtector protect(this);
+  UI_FireCallbackList(mSizeChangedFunctions);
+}
+
+void UI_Node::UI_DisabledStateChanged() {
+  UI_NodeProtector protect(this);
+  UI_Invalidate(nullptr, 0);
+  UI_FireCallbackList(mDisabledChangedFunctions);
+}
+
+bool UI_Node::UI_DoTimerNotify(long inTimerID) {
+  UI_NodeProtector protect(this);
+  const std::vector<TimerFunction> copy(mTimerFunctions);
+  for (const TimerFunction& f : copy) {
+    if (f && (*f)(inTimerID)) return true;
+  }
+  return false;
+}
+
+// ------------------------------------------------------------ simple defaults
+
+bool UI_Node::UI_HitTest(const PointF& inPoint) const {
+  RectF r = UI_GetLocalRectF(false);
+  return r.width > 0 && r.height > 0 && r.Contains(inPoint);
+}
+
+bool UI_Node::UI_AreAllParentsVisible() const {
+  if (!UI_IsShown()) return false;
+  UI_Node* parent = UI_GetParentNode();
+  return parent && parent->UI_AreAllParentsVisible();
+}
+
+bool UI_Node::UI_IsMouseOver() const { return mStateFlags.Test(kStateMouseOver); }
+
+// The draw traversal is added with the drawing of nodes; until then a node draws nothing.
+void UI_Node::UI_Draw(drawbot::Drawbot*) {}
+
+bool UI_Node::UI_UseDrawbotCache(drawbot::Drawbot*) const {
+  // kDrawCacheDefault asks the drawing supplier, which is not reachable from
+  // here yet; it is treated as "do not cache".
+  return mDrawCachePolicy == kDrawCacheAlways;
+}
+
+void UI_Node::UI_GetDrawSegments(std::vector<RectL>&) const {}
+
+drawbot::SupplierInterface* UI_Node::UI_GetDrawSupplier() const {
+  UI_Node* parent = UI_GetParentNode();
+  return parent ? parent->UI_GetDrawSupplier() : nullptr;
+}
+
+UI_NodeTimerManager* UI_Node::UI_GetTimerManager(bool inFlag) {
+  UI_Node* parent = UI_GetParentNode();
+  return parent ? parent->UI_GetTimerManager(inFlag) : nullptr;
+}
+
+const UI_NodeTimerManager* UI_Node::UI_GetTimerManager(bool inFlag) const {
+  const UI_Node* parent = UI_GetParentNode();
+  return parent ? parent->UI_GetTimerManager(inFlag) : nullptr;
+}
+
+bool UI_Node::UI_HandleDragEnter(const PointF&, datatransfer::OS_ReceiveData*, unsigned long& outEffect) {
+  outEffect = 0;
+  return false;
+}
+
+bool UI_Node::UI_HandleDragOver(const PointF&, datatransfer::OS_ReceiveData*, unsigned long& outEffect) {
+  outEffect = 0;
+  return false;
+}
+
+bool UI_Node::UI_HandleDrop(const PointF&, datatransfer::OS_ReceiveData*, unsigned long& outEffect) {
+  outEffect = 0;
+  return false;
+}
+
+bool UI_Node::UI_DispatchCursor(const PointF&, ModKeys, bool) { return false; }
+
+void UI_Node::UI_GetOSControlClipRects(OSControlClipRects& ioRects) const {
+  for (const UI_NodeP& child : mChildren) child->UI_GetOSControlClipRects(ioRects);
+}
+
+bool UI_Node::UI_PerformUserResizingDraw() {
+  UI_NodeManager* manager = UI_NodeManager::Get();
+  return manager && manager->InvalidateNodeAfterUserResize(this);
+}
+
+// ------------------------------------------------------------------- tool tips
+
+UI_Node* UI_Node::UI_GetToolTipForDisplay(UI_Node* inNode) {
+  if (!inNode) return nullptr;
+  UI_NodeManager* manager = UI_NodeManager::Get();
+  if (manager && manager->HasInputCapture()) return nullptr;
+  if (!inNode->UI_GetToolTip().empty()) return inNode;
+  for (UI_Node* p = inNode->UI_GetParentNode(); p; p = p->UI_GetParentNode()) {
+    if (!p->UI_GetToolTip().empty() && p->UI_DisplaysToolTipForChild(inNode)) return p;
+  }
+  return nullptr;
+}
+
+void UI_Node::UI_SetToolTip(const UTF16String& inText, long inWidth) {
+  if (inText == mToolTip) return;
+  mToolTip = inText;
+  mToolTipWidth = inWidth;
+  UI_NodeManager* manager = UI_NodeManager::Get();
+  UI_ToolTipManager* tips = manager ? manager->GetToolTipManager() : nullptr;
+  if (!tips) return;
+  UI_NodeProtector protect(this);
+  if (tips->GetToolTipNode() == this || UI_GetToolTipForDisplay(manager->GetMouseOverLeafNode()) == this) {
+    if (mToolTip.empty()) {
+      tips->DisposeToolTip();
+    } else {
+      tips->RefreshToolTip(this);
+    }
+  }
+}
+
+// ------------------------------------------------------------------ placement
+
+void UI_Node::measure(halvorn::extents_t&) {
+  tarsel::config::ThrowError(tarsel::config::ErrorLevel::kError,
+                             "$$$/norvik/ui/Error/MeasureNotOverridden=You must override UI_Node::measure");
+}
+
+void UI_Node::measure_vertical(halvorn::extents_t&, const halvorn::place_data_t&) {
+  tarsel::config::ThrowError(
+      tarsel::config::ErrorLevel::kError,
+      "$$$/norvik/ui/Error/MeasureVerticalNotOverridden=You must override UI_Node::measure_vertical");
+}
+
+void UI_Node::place(const halvorn::place_data_t& inPlace) {
+  mPlacementValid = true;
+  mPlacement = inPlace;
+  const auto& h = inPlace.horizontal();
+  const auto& v = inPlace.vertical();
+  UI_SetLocalRectF(RectF(h.position - h.outset_before, v.position - v.outset_before,
+                         h.length + h.outset_before + h.outset_after, v.length + v.outset_before + v.outset_after));
+}
+
+const halvorn::place_data_t& UI_Node::get_placement() {
+  if (!mPlacementValid) {
+    RectF r = UI_GetLocalRectF(true);
+    float left = std::floor(r.left), top = std::floor(r.top);
+    mPlacement.horizontal().position = left;
+    mPlacement.horizontal().length = std::ceil(r.Right()) - left;
+    mPlacement.vertical().position = top;
+    mPlacement.vertical().length = std::ceil(r.Bottom()) - top;
+  }
+  return mPlacement;
+}
+
+}  // namespace norvik::ui
