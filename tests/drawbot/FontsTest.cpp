@@ -1,0 +1,168 @@
+// Fonts: the refusal of substitutes, the cache, and where text lands.
+#include <gtest/gtest.h>
+
+#include "drawbot/DrawHelpers.h"
+#include "drawbot/FontFamilies.h"
+#include "support/drawbot/PixelCompare.h"
+#include "tarsel/ThrowError.h"
+
+namespace norvik::drawbot {
+namespace {
+
+using tarsel::geom::PointT;
+using tarsel::geom::RectT;
+using testing::PixelCanvas;
+using testing::PixelImage;
+
+auto const* Chars(UTF16String const& inText) { return reinterpret_cast<unsigned short const*>(inText.c_str()); }
+
+// Rows that hold any ink, as [first, last].
+std::pair<int, int> InkRows(PixelImage const& inImage) {
+  int first = -1, last = -1;
+  for (int y = 0; y < inImage.height; ++y)
+    for (int x = 0; x < inImage.width; ++x)
+      if (inImage.Alpha(x, y)) {
+        if (first < 0) first = y;
+        last = y;
+      }
+  return {first, last};
+}
+
+std::pair<int, int> InkColumns(PixelImage const& inImage) {
+  int first = -1, last = -1;
+  for (int x = 0; x < inImage.width; ++x)
+    for (int y = 0; y < inImage.height; ++y)
+      if (inImage.Alpha(x, y)) {
+        if (first < 0) first = x;
+        last = x;
+      }
+  return {first, last};
+}
+
+TEST(Fonts, AFamilyThatWouldBeSubstitutedIsRefusedAtCreation) {
+  try {
+    FontP font(NewOSSupplier(), u"Norvik Missing Sans", u"Bold", 12);
+    FAIL() << "a substitute font was accepted";
+  } catch (tarsel::config::Exception const& e) {
+    EXPECT_STREQ(e.what(), "Unable to load font \"Bold\" \"Norvik Missing Sans\"");
+    EXPECT_EQ(e.GetKeyPath(), "norvik/drawbot/Error/OSSupplier/UnableToCreateFont");
+  }
+}
+
+TEST(Fonts, TheFamilyIsComparedWithoutRegardToCase) {
+  FontP font(NewOSSupplier(), u"dejavu sans", u"", 12);
+  EXPECT_FALSE(font.IsNull());
+}
+
+TEST(Fonts, TheCacheHandsOutOneFontPerFamilyStyleAndSize) {
+  SupplierInterface const* supplier = NewOSSupplier();
+  FontP a(supplier, u"DejaVu Sans", u"", 12), b(supplier, u"DejaVu Sans", u"Regular", 12);
+  FontP bold(supplier, u"DejaVu Sans", u"Bold", 12), larger(supplier, u"DejaVu Sans", u"", 13);
+  EXPECT_EQ(a.Get(), b.Get());  // unknown styles are regular
+  EXPECT_NE(a.Get(), bold.Get());
+  EXPECT_NE(a.Get(), larger.Get());
+  EXPECT_GT(bold->MeasureStringWidth(Chars(u"Timeline"), -1), a->MeasureStringWidth(Chars(u"Timeline"), -1));
+}
+
+TEST(Fonts, SizeIsInPixelsAndMetricsFollowIt) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 20);
+  EXPECT_EQ(font->GetSize(), 20);
+  EXPECT_NEAR(font->GetAscent() + font->GetDescent(), 20 * 1.16, 2.0);
+  FontP twice(NewOSSupplier(), u"DejaVu Sans", u"", 40);
+  float w = font->MeasureStringWidth(Chars(u"Mixer"), -1);
+  EXPECT_NEAR(twice->MeasureStringWidth(Chars(u"Mixer"), -1), 2 * w, 2.0);
+  EXPECT_LT(font->MeasureStringWidth(Chars(u"Mixer"), 2), w);
+}
+
+TEST(Fonts, ChoosingAFamilyFallsBackToThePlatformsOwn) {
+  EXPECT_EQ(ChooseFontFamily({u"Norvik Missing Sans", u"DejaVu Sans Mono"}), u"DejaVu Sans Mono");
+  EXPECT_EQ(ChooseFontFamily({u"Norvik Missing Sans"}), u"DejaVu Sans");
+  EXPECT_FALSE(IsFontFamilyAvailable(u"Norvik Missing Sans"));
+}
+
+TEST(TextPlacement, ThePointIsOnTheBaseline) {
+  PixelCanvas canvas(60, 40);
+  FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 16);
+  BrushP brush(canvas.GetSupplier(), ColorRGBA(0, 0, 0, 1));
+  canvas.GetSurface()->DrawString(*brush, *font, Chars(u"HH"), PointT<float>(5, 25), kTextAlignLeft,
+                                  kTextTruncationNone, 0);
+  auto [top, bottom] = InkRows(canvas.Snapshot());
+  // Capitals sit on the baseline and rise about 0.73 em above it.
+  EXPECT_EQ(bottom, 24);
+  EXPECT_NEAR(top, 25 - 12, 1);
+}
+
+TEST(TextPlacement, AlignmentPutsThePointAtTheMiddleOrTheRightEnd) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 14);
+  float width = font->MeasureStringWidth(Chars(u"IIII"), -1);
+  for (auto align : {kTextAlignLeft, kTextAlignCenter, kTextAlignRight}) {
+    PixelCanvas canvas(100, 30);
+    BrushP brush(canvas.GetSupplier(), ColorRGBA(0, 0, 0, 1));
+    canvas.GetSurface()->DrawString(*brush, *font, Chars(u"IIII"), PointT<float>(50, 20), align,
+                                    kTextTruncationNone, 0);
+    auto [left, right] = InkColumns(canvas.Snapshot());
+    float expectedLeft = align == kTextAlignLeft ? 50 : align == kTextAlignCenter ? 50 - width / 2 : 50 - width;
+    EXPECT_NEAR(left, expectedLeft, 3) << align;
+    EXPECT_NEAR(right, expectedLeft + width, 3) << align;
+  }
+}
+
+TEST(TextPlacement, GridFittedTextMeasuresInWholePixels) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 13);
+  float width = font->MeasureStringWidth(Chars(u"Audio Track 1"), -1);
+  EXPECT_FLOAT_EQ(width, std::round(width));
+}
+
+TEST(TextPlacement, AntiAliasingOffGivesTwoLevelText) {
+  PixelCanvas canvas(80, 30);
+  FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 14);
+  BrushP brush(canvas.GetSupplier(), ColorRGBA(0, 0, 0, 1));
+  canvas.GetSurface()->DrawString(*brush, *font, Chars(u"Render"), PointT<float>(2, 20), kTextAlignLeft,
+                                  kTextTruncationNone, 0);
+  auto image = canvas.Snapshot();
+  int partial = 0, full = 0;
+  for (int y = 0; y < image.height; ++y)
+    for (int x = 0; x < image.width; ++x) {
+      partial += image.Alpha(x, y) > 0 && image.Alpha(x, y) < 255;
+      full += image.Alpha(x, y) == 255;
+    }
+  EXPECT_EQ(partial, 0);
+  EXPECT_GT(full, 20);
+}
+
+TEST(TextPlacement, TextMatchesItsReferenceImage) {
+  PixelCanvas canvas(120, 44);
+  canvas.Clear(0xffffff);
+  SurfaceInterface* surface = canvas.GetSurface();
+  FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 12);
+  BrushP brush(canvas.GetSupplier(), ColorRGBA(0.1f, 0.1f, 0.1f, 1));
+  surface->SetAntiAliasPolicy(kAntiAlias);
+  surface->DrawString(*brush, *font, Chars(u"Sequence 01"), PointT<float>(4, 14), kTextAlignLeft,
+                      kTextTruncationNone, 0);
+  surface->DrawString(*brush, *font, Chars(u"A clip with a long name"), PointT<float>(4, 34), kTextAlignLeft,
+                      kTextTruncationEndWithEllipsis, 90);
+  // The text tests use a tolerance: font hinting differs slightly between FreeType versions.
+  EXPECT_TRUE(testing::MatchesReference(canvas.Snapshot(), "drawbot/text", 24));
+}
+
+TEST(Baseline, TheDefaultBaselineDependsOnlyOnTheSize) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
+  // 12 * 0.9 + 10 + (20 - 12) * 0.5 = 24.8, rounded.
+  EXPECT_EQ(GetFontBaseline(font, RectT<float>(0, 10, 100, 20)), 25);
+  FontP bold(NewOSSupplier(), u"DejaVu Sans", u"Bold", 12);
+  EXPECT_EQ(GetFontBaseline(bold, RectT<float>(0, 10, 100, 20)), 25);
+}
+
+TEST(Baseline, TheSettingMakesTheBaselineFollowAscentAndDescent) {
+  SetBoolSettingReader([](char const* inKey, bool inDefault) {
+    return std::string(inKey) == "norvik.utils.FontDependentBaselines" ? true : inDefault;
+  });
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
+  float a = font->GetAscent(), d = font->GetDescent();
+  EXPECT_FLOAT_EQ(GetFontBaseline(font, RectT<float>(0, 10, 100, 20)), 10 + ((20 - (a + d)) * 0.5f + a));
+  SetBoolSettingReader(nullptr);
+  EXPECT_EQ(GetFontBaseline(font, RectT<float>(0, 10, 100, 20)), 25);
+}
+
+}  // namespace
+}  // namespace norvik::drawbot
