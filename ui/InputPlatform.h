@@ -1,9 +1,9 @@
 #pragma once
-// What event dispatch needs to ask the platform outside of a message: the
-// modifier state and the removal of a pending message from the native queue.
-// The platform layer installs its implementation at start-up; until it does,
-// a quiet platform answers (no modifiers, an empty queue), which is also what
-// tests without a window see.
+// What event dispatch asks of the platform outside of a message: the
+// modifier state, the removal of a pending message from the native queue, and
+// the default cursor. By default these questions go to the installed native
+// layer (and get quiet answers when there is none: no modifiers, an empty
+// queue); a test can install its own answers instead.
 #include "ui/ModifierKeys.h"
 #include "ui/OS_Event.h"
 
@@ -20,12 +20,14 @@ class InputPlatformInterface {
   // Removes the oldest pending message inMessage for inWindow from the native
   // queue; true when there was one.
   virtual bool RemovePendingMessage(OS_WindowHandle inWindow, unsigned inMessage) = 0;
+  // Shows the platform's standard arrow.
+  virtual void SetDefaultCursor() = 0;
 };
 
-// The installed platform, or the quiet one.
+// The installed answers, or those of the native layer.
 InputPlatformInterface& GetInputPlatform();
-// Installs the platform; the caller keeps ownership and uninstalls it (null)
-// before destroying it.
+// Installs other answers; the caller keeps ownership and uninstalls them
+// (null) before destroying them.
 void SetInputPlatform(InputPlatformInterface* inPlatform);
 
 }  // namespace norvik::ui

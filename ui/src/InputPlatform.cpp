@@ -1,13 +1,45 @@
 #include "ui/InputPlatform.h"
 
+#include "ui/OS_NativeLayer.h"
+
 namespace norvik::ui {
 namespace {
 
-class QuietInputPlatform : public InputPlatformInterface {
+constexpr short kKeyDownBit = static_cast<short>(0x8000);
+constexpr short kKeyToggledBit = 1;
+
+// Reads the modifiers from a key-state function of the native layer: Shift,
+// Ctrl and Alt held, Caps Lock toggled (always from the message's state).
+template <typename KeyState>
+ModifierKeys ReadModKeys(const OS_NativeLayer& inLayer, KeyState inKeyState) {
+  ModifierKeys keys;
+  if ((inKeyState(kOSKeyShift) & kKeyDownBit) != 0) keys.Set(kModKeyShift);
+  if ((inKeyState(kOSKeyControl) & kKeyDownBit) != 0) keys.Set(kModKeyCtrl);
+  if ((inKeyState(kOSKeyAlt) & kKeyDownBit) != 0) keys.Set(kModKeyAlt);
+  if ((inLayer.GetKeyState(kOSKeyCapsLock) & kKeyToggledBit) != 0) keys.Set(kModKeyCapsLock);
+  return keys;
+}
+
+class NativeInputPlatform : public InputPlatformInterface {
  public:
-  ModifierKeys GetRecentEventModKeys() const override { return {}; }
-  ModifierKeys GetCurrentModKeys() const override { return {}; }
-  bool RemovePendingMessage(OS_WindowHandle, unsigned) override { return false; }
+  ModifierKeys GetRecentEventModKeys() const override {
+    const OS_NativeLayer* layer = GetNativeLayer();
+    if (!layer) return {};
+    return ReadModKeys(*layer, [layer](int inKey) { return layer->GetKeyState(inKey); });
+  }
+  ModifierKeys GetCurrentModKeys() const override {
+    const OS_NativeLayer* layer = GetNativeLayer();
+    if (!layer) return {};
+    return ReadModKeys(*layer, [layer](int inKey) { return layer->GetAsyncKeyState(inKey); });
+  }
+  bool RemovePendingMessage(OS_WindowHandle inWindow, unsigned inMessage) override {
+    OS_NativeLayer* layer = GetNativeLayer();
+    OS_Event removed;
+    return layer && layer->PeekMessage(removed, inWindow, inMessage, inMessage, true);
+  }
+  void SetDefaultCursor() override {
+    if (OS_NativeLayer* layer = GetNativeLayer()) layer->SetCursor(layer->LoadSystemCursor(kOSCursorArrow));
+  }
 };
 
 InputPlatformInterface* sInstalledPlatform = nullptr;
@@ -15,8 +47,8 @@ InputPlatformInterface* sInstalledPlatform = nullptr;
 }  // namespace
 
 InputPlatformInterface& GetInputPlatform() {
-  static QuietInputPlatform sQuiet;
-  return sInstalledPlatform ? *sInstalledPlatform : sQuiet;
+  static NativeInputPlatform sNative;
+  return sInstalledPlatform ? *sInstalledPlatform : sNative;
 }
 
 void SetInputPlatform(InputPlatformInterface* inPlatform) { sInstalledPlatform = inPlatform; }

@@ -1,6 +1,6 @@
 #pragma once
 // Test doubles of the input seams: a platform whose modifier state a test
-// sets and whose native queue it fills, and a keyboard layout built from a
+// sets, whose native queue it fills and which counts default cursors, and a keyboard layout built from a
 // table. Each installs itself for its lifetime and uninstalls on destruction.
 #include <map>
 #include <utility>
@@ -21,12 +21,14 @@ class FakeInputPlatform : public InputPlatformInterface {
   ModifierKeys GetRecentEventModKeys() const override { return mRecentModKeys; }
   ModifierKeys GetCurrentModKeys() const override { return mCurrentModKeys; }
   bool RemovePendingMessage(OS_WindowHandle inWindow, unsigned inMessage) override;
+  void SetDefaultCursor() override { ++mDefaultCursorCount; }
 
   void PostMessage(OS_WindowHandle inWindow, unsigned inMessage) { mQueue.emplace_back(inWindow, inMessage); }
   const std::vector<std::pair<OS_WindowHandle, unsigned>>& GetQueue() const { return mQueue; }
 
   ModifierKeys mRecentModKeys;
   ModifierKeys mCurrentModKeys;
+  int mDefaultCursorCount = 0;
 
  private:
   std::vector<std::pair<OS_WindowHandle, unsigned>> mQueue;
