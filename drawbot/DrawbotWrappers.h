@@ -80,6 +80,16 @@ class LinearShaderP : public SharedPImpl<LinearShaderInterface> {
       : SharedPImpl(inSupplier ? inSupplier->NewLinearShader(inStart, inEnd, inStops) : nullptr) {}
 };
 
+class RadialShaderP : public SharedPImpl<RadialShaderInterface> {
+ public:
+  RadialShaderP() = default;
+  RadialShaderP(SupplierInterface const* inSupplier, tarsel::geom::PointT<float> const& inCentre, float const* inRadii,
+                tarsel::geom::PointT<float> const& inFocus, ColorRGBA const* inColors, float const* inPositions,
+                unsigned long inCount)
+      : SharedPImpl(inSupplier ? inSupplier->NewRadialShader(inCentre, inRadii, inFocus, inColors, inPositions, inCount)
+                               : nullptr) {}
+};
+
 class PathP : public SharedPImpl<PathInterface> {
  public:
   PathP() = default;
