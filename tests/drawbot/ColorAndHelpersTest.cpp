@@ -1,0 +1,316 @@
+// Colour values, HSB, swizzles, colour management, monitors, shape helpers
+// and pixel buffers.
+#include <stdexcept>
+
+#include <gtest/gtest.h>
+
+#include "drawbot/ColorManagement.h"
+#include "drawbot/DrawHelpers.h"
+#include "drawbot/MemBuffer.h"
+#include "support/drawbot/RecordingSupplier.h"
+#include "tarsel/ThrowError.h"
+
+namespace norvik::drawbot {
+namespace {
+
+using tarsel::geom::PointT;
+using tarsel::geom::RectT;
+using testing::RecordingPath;
+using testing::RecordingSupplier;
+
+TEST(ColorPacking, ChannelsRoundHalfAwayFromZeroIntoARGB) {
+  EXPECT_EQ(ColorRGBA(1, 0, 0, 1).ToPacked(), 0xffff0000u);
+  EXPECT_EQ(ColorRGBA(0, 0.5f, 0, 0.5f).ToPacked(), 0x80008000u);  // 127.5 rounds up
+  EXPECT_EQ(ColorRGBA(0.2f, 0.4f, 0.6f, 0).ToPacked(), 0x00336699u);
+  EXPECT_EQ(ColorRGBA(2, -1, 0, 1).ToPacked(), 0xffff0000u);
+  EXPECT_EQ(ColorRGBA::FromPacked(0x80ff0000u).ToPacked(), 0x80ff0000u);
+}
+
+TEST(HSB, PrimaryAndGreyColoursConvertBothWays) {
+  ColorRGBA red = HSBtoRGB<float>(0, 1, 1, 1);
+  EXPECT_EQ(red, ColorRGBA(1, 0, 0, 1));
+  ColorRGBA grey = HSBtoRGB<double>(200, 0, 0.5, 0.25f);
+  EXPECT_EQ(grey, ColorRGBA(0.5f, 0.5f, 0.5f, 0.25f));
+  double h, s, b;
+  RGBtoHSB(ColorRGBA(0, 0, 1, 1), h, s, b);
+  EXPECT_DOUBLE_EQ(h, 240);
+  EXPECT_DOUBLE_EQ(s, 1);
+  EXPECT_DOUBLE_EQ(b, 1);
+}
+
+TEST(HSB, ANegativeHueEqualsItsPositiveTwin) {
+  EXPECT_EQ(HSBtoRGB<float>(-30, 0.8f, 0.9f, 1), HSBtoRGB<float>(330, 0.8f, 0.9f, 1));
+  EXPECT_EQ(HSBtoRGB<float>(390, 0.8f, 0.9f, 1), HSBtoRGB<float>(30, 0.8f, 0.9f, 1));
+}
+
+TEST(HSB, RoundTripsThroughEverySector) {
+  for (float hue = 5; hue < 360; hue += 37) {
+    ColorRGBA c = HSBtoRGB<double>(hue, 0.6, 0.7, 1);
+    double h, s, b;
+    RGBtoHSB(c, h, s, b);
+    EXPECT_NEAR(h, hue, 1e-3);
+    EXPECT_NEAR(s, 0.6, 1e-5);
+    EXPECT_NEAR(b, 0.7, 1e-5);
+  }
+}
+
+TEST(Swizzle, PremultiplyingScalesColourByAlphaAndLeavesOpaquePixels) {
+  unsigned char px[8] = {128, 255, 100, 2, /* */ 255, 10, 20, 30};
+  inplace_swizzle<4, 5>(px, 2);
+  EXPECT_EQ(px[1], 128);
+  EXPECT_EQ(px[2], 50);
+  EXPECT_EQ(px[3], 1);
+  EXPECT_EQ(px[5], 10);
+}
+
+TEST(Swizzle, DividingAlphaOutLeavesTransparentAndOpaquePixels) {
+  unsigned char px[12] = {0, 9, 8, 7, /* */ 128, 64, 32, 0, /* */ 255, 1, 2, 3};
+  inplace_swizzle<5, 4>(px, 3);
+  EXPECT_EQ(px[1], 9);  // a fully transparent pixel keeps its bytes
+  EXPECT_EQ(px[5], 127);
+  EXPECT_EQ(px[6], 63);
+  EXPECT_EQ(px[9], 1);
+}
+
+TEST(Swizzle, ReversingBytesIsItsOwnInverse) {
+  unsigned char px[4] = {1, 2, 3, 4};
+  inplace_swizzle<4, 6>(px, 1);
+  EXPECT_EQ(px[0], 4);
+  EXPECT_EQ(px[3], 1);
+  inplace_swizzle<6, 4>(px, 1);
+  EXPECT_EQ(px[0], 1);
+  EXPECT_EQ(px[2], 3);
+}
+
+TEST(Profiles, BytesPerPixelFollowLayoutAndDepth) {
+  ColorDestinationProfile profile;
+  EXPECT_EQ(profile.GetPixelLayout(), kPixelLayoutARGB);
+  EXPECT_EQ(profile.GetDepth(), 8u);
+  EXPECT_EQ(profile.GetBytesPerPixel(), 4u);
+  profile.SetDepth(4);
+  EXPECT_EQ(profile.GetBytesPerPixel(), 3u);
+  profile.SetDepth(8);
+  profile.SetPixelLayout(kPixelLayoutRGB24);
+  EXPECT_EQ(profile.GetBytesPerPixel(), 3u);
+  ImageDestinationProfile image;
+  EXPECT_TRUE(image.GetBounds().IsEmpty());
+  EXPECT_TRUE(image.GetSubregion().IsEmpty());
+}
+
+struct AppData : OpaqueApplicationData {};
+
+int gCallbackCalls = 0;
+void CountingCallback(ColorDestinationProfile const&, OpaqueApplicationData const&, void*) { ++gCallbackCalls; }
+
+TEST(ColorManagement, ManageCallsTheInstalledCallbackForAManagedVisual) {
+  gCallbackCalls = 0;
+  SetColorManagementCallback(&CountingCallback);
+  boost::intrusive_ptr<ManagedImage> image(new ManagedImage());
+  image->Manage(ImageDestinationProfile(), AppData(), nullptr);
+  EXPECT_EQ(gCallbackCalls, 1);
+  SetColorManagementCallback(nullptr);
+}
+
+TEST(ColorManagement, WithoutACallbackOrForAnUnmanagedVisualManageRaisesTheError) {
+  SetColorManagementCallback(nullptr);
+  boost::intrusive_ptr<ManagedImage> managed(new ManagedImage());
+  EXPECT_THROW(managed->Manage(ImageDestinationProfile(), AppData(), nullptr), tarsel::config::Exception);
+  SetColorManagementCallback(&CountingCallback);
+  boost::intrusive_ptr<UnManagedRGBA> plain(new UnManagedRGBA(ColorRGBA(1, 0, 0, 1)));
+  try {
+    plain->Manage(ColorDestinationProfile(), AppData(), nullptr);
+    FAIL() << "managing an unmanaged colour was accepted";
+  } catch (tarsel::config::Exception const& e) {
+    EXPECT_STREQ(e.what(), "Color management callback not registered.");
+  }
+  SetColorManagementCallback(nullptr);
+}
+
+// Two side-by-side monitors of 100 x 100.
+class TwoMonitors : public MonitorSource {
+ public:
+  long GetMonitorCount() const override { return 2; }
+  bool GetMonitorRect(long i, RectT<long>* out) const override {
+    if (failing) return false;
+    *out = RectT<long>(i * 100, 0, 100, 100);
+    return true;
+  }
+  void const* GetMonitorIDFromRect(RectT<long> const& r) const override { return r.left < 100 ? &a : &b; }
+  bool failing = false;
+  int a = 0, b = 0;
+};
+
+class Monitors : public ::testing::Test {
+ protected:
+  void SetUp() override { SetMonitorSource(&monitors); }
+  void TearDown() override { SetMonitorSource(nullptr); }
+  TwoMonitors monitors;
+};
+
+TEST_F(Monitors, ARectangleIsSplitAtTheBorderInMonitorOrder) {
+  auto pieces = SubdivideByMonitor(RectT<long>(80, 10, 40, 20));
+  ASSERT_EQ(pieces.size(), 2u);
+  EXPECT_EQ(pieces[0].first, RectT<long>(80, 10, 20, 20));
+  EXPECT_EQ(pieces[0].second, &monitors.a);
+  EXPECT_EQ(pieces[1].first, RectT<long>(100, 10, 20, 20));
+  EXPECT_EQ(pieces[1].second, &monitors.b);
+  EXPECT_TRUE(SubdivideByMonitor(RectT<long>(300, 300, 10, 10)).empty());
+}
+
+TEST_F(Monitors, AFailedQueryRaisesBugInMonitorInfo) {
+  monitors.failing = true;
+  try {
+    SubdivideByMonitor(RectT<long>(0, 0, 10, 10));
+    FAIL();
+  } catch (std::runtime_error const& e) {
+    EXPECT_STREQ(e.what(), "Bug in MonitorInfo");
+  }
+}
+
+class CountingColor : public UnManagedColor {
+ public:
+  ColorRGBA Convert(ColorDestinationProfile const& inProfile) override {
+    ids.push_back(inProfile.GetDisplayID());
+    return ColorRGBA(0, 1, 0, 1);
+  }
+  std::vector<void const*> ids;
+};
+
+TEST_F(Monitors, AColourManagedRectangleIsConvertedOncePerMonitorAndCoversTheRectangle) {
+  RecordingSupplier supplier;
+  SurfaceP surface(supplier.NewOffscreenSurface(200, 100, false));
+  Drawbot drawbot(&supplier, surface.Get());
+  boost::intrusive_ptr<CountingColor> color(new CountingColor());
+  // Surface origin at global (50, 0): local 30.5 .. 70.2 is global 80.5 .. 120.2.
+  PaintColorManagedRect(drawbot, RectT<float>(30.5f, 5, 39.7f, 10), PointT<long>(50, 0), color);
+  EXPECT_EQ(color->ids, (std::vector<void const*>{&monitors.a, &monitors.b}));
+  ASSERT_EQ(supplier.GetCalls().size(), 2u);
+  EXPECT_EQ(supplier.GetCalls()[0].rect, RectT<float>(30, 5, 20, 10));
+  EXPECT_EQ(supplier.GetCalls()[1].rect, RectT<float>(50, 5, 21, 10));
+}
+
+class SolidImage : public UnManagedImage {
+ public:
+  void Convert(ImageDestinationProfile const& inProfile, void* outDest) const override {
+    layouts.push_back(inProfile.GetPixelLayout());
+    auto* p = static_cast<unsigned char*>(outDest);
+    RectT<long> r = inProfile.GetSubregion();
+    for (long i = 0; i < r.width * r.height; ++i) {
+      p[4 * i] = 255;  // A, R, G, B
+      p[4 * i + 1] = 255;
+    }
+  }
+  mutable std::vector<PixelLayout> layouts;
+};
+
+TEST_F(Monitors, AColourManagedImageIsConvertedPerMonitorAndDrawnAtEachPiece) {
+  RecordingSupplier supplier;
+  SurfaceP surface(supplier.NewOffscreenSurface(200, 100, false));
+  Drawbot drawbot(&supplier, surface.Get());
+  boost::intrusive_ptr<SolidImage> image(new SolidImage());
+  PaintColorManagedImage(drawbot, RectT<float>(90, 0, 20, 4), PointT<long>(0, 0), image);
+  // The layout is left at 6 after the first piece.
+  EXPECT_EQ(image->layouts, (std::vector<PixelLayout>{kPixelLayoutARGB, kPixelLayoutBGRA}));
+  ASSERT_EQ(supplier.GetCalls().size(), 2u);
+  EXPECT_EQ(supplier.GetCalls()[0].rect, RectT<float>(90, 0, 10, 4));
+  EXPECT_EQ(supplier.GetCalls()[1].rect, RectT<float>(100, 0, 10, 4));
+}
+
+TEST(ShapeHelpers, TheEllipseIsFourBeziersClockwiseFromTheTop) {
+  RecordingSupplier supplier;
+  PathP path;
+  GetEllipsePath(&supplier, RectT<float>(0, 0, 20, 10), &path);
+  auto const& recorded = dynamic_cast<RecordingPath const&>(*path);
+  EXPECT_EQ(recorded.GetOps(), (std::vector<std::string>{"M", "C", "C", "C", "C", "Z"}));
+  EXPECT_EQ(recorded.GetPoints()[0], PointT<float>(10, 0));
+  EXPECT_EQ(recorded.GetPoints()[3], PointT<float>(20, 5));  // right middle
+  EXPECT_NEAR(recorded.GetPoints()[1].x, 10 + 10 * 0.5522847f, 1e-4);
+  EXPECT_EQ(recorded.GetPoints()[6], PointT<float>(10, 10));  // bottom middle
+}
+
+TEST(ShapeHelpers, ANullSupplierKeepsTheExistingPath) {
+  RecordingSupplier supplier;
+  PathP path(&supplier);
+  PathInterface* before = path.Get();
+  GetEllipsePath(nullptr, RectT<float>(0, 0, 20, 10), &path);
+  EXPECT_EQ(path.Get(), before);
+}
+
+TEST(ShapeHelpers, ARoundedRectangleWithRadiusZeroIsAPlainRectangle) {
+  RecordingSupplier supplier;
+  PathP path;
+  GetRoundedRectPath(&supplier, RectT<float>(1, 2, 30, 20), 0, &path);
+  EXPECT_EQ(dynamic_cast<RecordingPath const&>(*path).GetDescription(), "R 1 2 30 20");
+}
+
+TEST(ShapeHelpers, RoundedCornersUseHalfTheCornerSizeAsControlDistance) {
+  RecordingSupplier supplier;
+  PathP path;
+  GetRoundedRectPath(&supplier, RectT<float>(0, 0, 40, 20), 4, &path);
+  auto const& recorded = dynamic_cast<RecordingPath const&>(*path);
+  EXPECT_EQ(recorded.GetOps(), (std::vector<std::string>{"M", "L", "C", "L", "C", "L", "C", "L", "C", "Z"}));
+  // Top right corner: from (36, 0) with controls (38, 0) and (40, 2) to (40, 4).
+  EXPECT_EQ(recorded.GetPoints()[2], PointT<float>(38, 0));
+  EXPECT_EQ(recorded.GetPoints()[3], PointT<float>(40, 2));
+  EXPECT_EQ(recorded.GetPoints()[4], PointT<float>(40, 4));
+}
+
+TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeet) {
+  RecordingSupplier supplier;
+  PathP path;
+  GetRoundedRectPath(&supplier, RectT<float>(0, 0, 40, 10), 8, &path);
+  auto const& points = dynamic_cast<RecordingPath const&>(*path).GetPoints();
+  // The right side: the top right corner ends where the bottom right one starts.
+  EXPECT_EQ(points[4], PointT<float>(40, 5));
+  EXPECT_EQ(points[5], PointT<float>(40, 5));
+}
+
+TEST(ShapeHelpers, StrokeRectStrokesAnAlignedRectangleWithoutAntiAliasing) {
+  RecordingSupplier supplier;
+  SurfaceP surface(supplier.NewOffscreenSurface(50, 50, false));
+  surface->SetAntiAliasPolicy(kAntiAliasHighQuality);
+  Drawbot drawbot(&supplier, surface.Get());
+  StrokeRect(drawbot, RectT<long>(2, 3, 10, 5), ColorRGBA(1, 0, 0, 1), 2);
+  std::vector<std::string> expected = {"Push", "StrokePath", "Pop"};
+  ASSERT_EQ(supplier.GetOps(), expected);
+  EXPECT_EQ(supplier.GetCalls()[1].text, "R 2 3 10 5");
+  EXPECT_EQ(supplier.GetCalls()[1].antiAlias, kAntiAliasNone);
+  EXPECT_EQ(supplier.GetCalls()[1].color, ColorRGBA(1, 0, 0, 1));
+  EXPECT_EQ(surface->GetAntiAliasPolicy(), kAntiAliasHighQuality);
+}
+
+TEST(ShapeHelpers, IntegerFormsKeepAPathPixelAlignedAndAnyFloatFormClearsIt) {
+  RecordingSupplier supplier;
+  PathP path(&supplier);
+  path->MoveTo(PointT<long>(0, 0));
+  path->LineTo(PointT<long>(5, 0));
+  path->AddRect(RectT<long>(1, 1, 2, 2));
+  EXPECT_TRUE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
+  path->LineTo(PointT<float>(5, 5));
+  EXPECT_FALSE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
+}
+
+TEST(FlashDelay, DefaultsToZeroAndKeepsWhatIsSet) {
+  EXPECT_EQ(GetRedrawDebugFlashDelay(), 0u);
+  SetRedrawDebugFlashDelay(30);
+  EXPECT_EQ(GetRedrawDebugFlashDelay(), 30u);
+  SetRedrawDebugFlashDelay(0);
+}
+
+TEST(MemBuffers, RowsAreSixteenByteAlignedAndChannelsSwap) {
+  boost::intrusive_ptr<MemBuffer> buffer(new MemBuffer(5, 3, 3));
+  EXPECT_EQ(buffer->GetRowBytes(), 16);
+  EXPECT_EQ(reinterpret_cast<std::uintptr_t>(buffer->GetDataPtr()) % 16, 0u);
+  buffer->ClearBuffer();
+  unsigned char* row1 = buffer->GetDataPtr() + buffer->GetRowBytes();
+  row1[0] = 1;
+  row1[2] = 3;
+  buffer->SwapColorChannels();
+  EXPECT_EQ(row1[0], 3);
+  EXPECT_EQ(row1[2], 1);
+  boost::intrusive_ptr<MemBuffer> wide(new MemBuffer(17, 2, 4));
+  EXPECT_EQ(wide->GetRowBytes(), 80);
+}
+
+}  // namespace
+}  // namespace norvik::drawbot
