@@ -1,0 +1,354 @@
+// Focus advance with Tab: order, nesting, wrapping, containers that keep Tab
+// inside, hidden and disabled subtrees, tab weights, the Tab key itself, and
+// host code that changes the tree during the walk.
+#include <functional>
+#include <random>
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "support/ui/FocusTestNodes.h"
+#include "tarsel/ThrowError.h"
+#include "ui/KeyboardEvent.h"
+#include "ui/UI_NodeManager.h"
+
+namespace norvik::ui {
+namespace {
+
+using test::AddPanel;
+using test::AddView;
+using test::FocusableViewP;
+using test::FocusLeafID;
+using test::FocusLog;
+
+class FocusAdvanceTest : public ::testing::Test {
+ protected:
+  FocusAdvanceTest() : mWindow(new test::TestWindowNode) {
+    mWindow->mWantsFocus = false;
+    mManager.SetFocusPlatform(&mPlatform);
+  }
+  ~FocusAdvanceTest() override { mManager.SetFocusPlatform(nullptr); }
+
+  // Tab (or Shift+Tab) from the current focus leaf.
+  bool Tab(bool inForward = true) {
+    UI_Node* leaf = mManager.GetKeyboardFocusLeafNode();
+    return UI_Node::UI_AdvanceFocus(inForward, leaf->UI_GetIndex(), leaf->UI_GetParentContainer());
+  }
+
+  UI_NodeManager mManager;
+  test::TableFocusPlatform mPlatform;
+  boost::intrusive_ptr<test::TestWindowNode> mWindow;
+};
+
+TEST_F(FocusAdvanceTest, TabMovesToTheNextSiblingThatWantsFocus) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  b->mWantsFocus = false;
+  FocusableViewP c = AddView(*mWindow, "c");
+  ASSERT_TRUE(a->UI_GainKeyboardFocus(kFocusChangeMouse));
+  EXPECT_TRUE(Tab());
+  EXPECT_EQ(FocusLeafID(), "c");
+  EXPECT_TRUE(c->UI_HasKeyboardFocus(true));
+  EXPECT_FALSE(a->UI_HasKeyboardFocus(false));
+}
+
+TEST_F(FocusAdvanceTest, ANodeThatOnlyRefusesFocusFromAdvanceIsPassedOver) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  b->mWantsFocusFromAdvance = false;
+  AddView(*mWindow, "c");
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "c");
+}
+
+TEST_F(FocusAdvanceTest, ForwardFromTheLastChildOfAPanelGoesToThePanelsNextSibling) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  AddView(*panel, "b");
+  FocusableViewP c = AddView(*panel, "c");
+  AddView(*mWindow, "d");
+  c->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "d");
+}
+
+TEST_F(FocusAdvanceTest, BackwardFromTheFirstChildAsksTheParentBeforeWrapping) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  FocusableViewP b = AddView(*panel, "b");
+  AddView(*panel, "c");
+  b->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab(false);
+  EXPECT_EQ(FocusLeafID(), "a");
+}
+
+TEST_F(FocusAdvanceTest, AtTheTopTheWalkWrapsAroundTheWindow) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  FocusableViewP b = AddView(*panel, "b");
+  FocusableViewP d = AddView(*mWindow, "d");
+  d->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "a");
+  Tab(false);
+  EXPECT_EQ(FocusLeafID(), "d");
+  b->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab(false);
+  EXPECT_EQ(FocusLeafID(), "a");
+}
+
+TEST_F(FocusAdvanceTest, BackwardIntoAPanelLandsOnItsLastChild) {
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  AddView(*panel, "b");
+  AddView(*panel, "c");
+  FocusableViewP d = AddView(*mWindow, "d");
+  d->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab(false);
+  EXPECT_EQ(FocusLeafID(), "c");
+}
+
+TEST_F(FocusAdvanceTest, AContainerThatKeepsFocusAmongItsChildrenWrapsInsideItself) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  panel->mAllowAdvanceFromChildren = false;
+  FocusableViewP b = AddView(*panel, "b");
+  FocusableViewP c = AddView(*panel, "c");
+  AddView(*mWindow, "d");
+  c->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "b");
+  Tab(false);
+  EXPECT_EQ(FocusLeafID(), "c");
+}
+
+TEST_F(FocusAdvanceTest, AHiddenSubtreeIsSearchedButNothingInItGainsFocus) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  FocusableViewP b = AddView(*panel, "b");
+  AddView(*mWindow, "d");
+  panel->UI_Show(false);
+  mWindow->ChildGet(0)->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "d");
+  EXPECT_EQ(b->mPrepareCalls, 1);
+  EXPECT_FALSE(b->UI_HasKeyboardFocus(false));
+}
+
+TEST_F(FocusAdvanceTest, ADisabledNodeIsSkippedButItsEnabledChildrenAreSearched) {
+  AddView(*mWindow, "a");
+  FocusableViewP group = AddView(*mWindow, "group");
+  AddView(*group, "b");
+  AddView(*mWindow, "d");
+  group->UI_SetSelfDisabled(true);  // only the group itself: its child stays enabled
+  mWindow->ChildGet(0)->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "b");
+}
+
+TEST_F(FocusAdvanceTest, ChildrenDisabledThroughTheirAncestorDoNotGainFocus) {
+  AddView(*mWindow, "a");
+  FocusableViewP group = AddPanel(*mWindow, "group");
+  FocusableViewP b = AddView(*group, "b");
+  AddView(*mWindow, "d");
+  group->UI_SetDisabled(true);
+  ASSERT_TRUE(b->UI_IsDisabled());
+  mWindow->ChildGet(0)->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(FocusLeafID(), "d");
+  EXPECT_EQ(b->mPrepareCalls, 0);
+}
+
+TEST_F(FocusAdvanceTest, WithOneFocusableNodeTabKeepsItAndSendsNothing) {
+  FocusLog log;
+  FocusableViewP panel = AddPanel(*mWindow, "panel", &log);
+  FocusableViewP only = AddView(*panel, "only", &log);
+  AddPanel(*mWindow, "empty", &log);
+  only->UI_GainKeyboardFocus(kFocusChangeMouse);
+  log.clear();
+  EXPECT_TRUE(Tab());
+  EXPECT_EQ(FocusLeafID(), "only");
+  EXPECT_TRUE(Tab(false));
+  EXPECT_EQ(FocusLeafID(), "only");
+  EXPECT_TRUE(log.empty());
+  EXPECT_TRUE(only->UI_HasKeyboardFocus(true));
+}
+
+TEST_F(FocusAdvanceTest, WhenNothingTakesFocusItStaysAndNoKeyIsRemoved) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  a->mWantsFocusFromAdvance = false;
+  AddPanel(*mWindow, "b");
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  EXPECT_FALSE(Tab());
+  EXPECT_EQ(FocusLeafID(), "a");
+  EXPECT_EQ(mPlatform.mKeyRemovals, 0);
+}
+
+TEST_F(FocusAdvanceTest, PendingKeysAreRemovedOnlyWhenFocusMoved) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  AddView(*mWindow, "b");
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  Tab();
+  EXPECT_EQ(mPlatform.mKeyRemovals, 1);
+}
+
+TEST_F(FocusAdvanceTest, FocusFromAdvanceIsReportedWithTheAdvanceReason) {
+  FocusLog log;
+  FocusableViewP a = AddView(*mWindow, "a", &log);
+  AddView(*mWindow, "b", &log);
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  log.clear();
+  Tab();
+  EXPECT_EQ(log, (FocusLog{{"a", kFocusChangeAdvance, false}, {"b", kFocusChangeAdvance, true}}));
+}
+
+TEST_F(FocusAdvanceTest, ANullParentIsAContractViolation) {
+  EXPECT_THROW(UI_Node::UI_AdvanceFocus(true, 0, nullptr), tarsel::config::Exception);
+}
+
+TEST_F(FocusAdvanceTest, AnEmptyWindowFindsNothing) {
+  EXPECT_FALSE(UI_Node::UI_AdvanceFocus(true, -1, mWindow.get()));
+  EXPECT_FALSE(UI_Node::UI_AdvanceFocus(false, -1, mWindow.get()));
+}
+
+TEST_F(FocusAdvanceTest, TabWeightsOrderTheWalk) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  FocusableViewP c = AddView(*mWindow, "c");
+  a->UI_SetTabOrderWeight(2);
+  b->UI_SetTabOrderWeight(1);
+  c->UI_SetTabOrderWeight(0);
+  EXPECT_TRUE(UI_Node::UI_AdvanceFocus(true, -1, mWindow.get()));
+  EXPECT_EQ(FocusLeafID(), "c");
+  EXPECT_TRUE(UI_Node::UI_AdvanceFocus(false, -1, mWindow.get()));
+  EXPECT_EQ(FocusLeafID(), "a");
+}
+
+TEST_F(FocusAdvanceTest, AHandlerThatRemovesThePanelDuringTheWalkDoesNotCrash) {
+  AddView(*mWindow, "a");
+  FocusableViewP panel = AddPanel(*mWindow, "panel");
+  FocusableViewP b = AddView(*panel, "b");
+  b->mWantsFocus = false;
+  FocusableViewP c = AddView(*panel, "c");
+  AddView(*mWindow, "d");
+  UI_Node* window = mWindow.get();
+  b->mOnPrepare = [window, raw = panel.get()] { window->ChildRemove(raw); };
+  panel.reset();
+  b.reset();
+  c.reset();
+  window->ChildGet(0)->UI_GainKeyboardFocus(kFocusChangeMouse);
+  EXPECT_TRUE(Tab());
+  EXPECT_EQ(mWindow->ChildSize(), 2u);
+  // The panel left with b and c; the walk went on to what is still there.
+  EXPECT_EQ(FocusLeafID(), "d");
+}
+
+TEST_F(FocusAdvanceTest, AHandlerThatEmptiesTheWindowEndsTheWalk) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  b->mWantsFocus = false;
+  UI_Node* window = mWindow.get();
+  b->mOnPrepare = [window] { window->DeleteChildren(); };
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  a.reset();
+  b.reset();
+  EXPECT_FALSE(Tab());
+  EXPECT_EQ(mWindow->ChildSize(), 0u);
+}
+
+// ---------------------------------------------------------------- the key
+
+KeyboardEvent TabKey(KeyboardEvent::Action inAction, unsigned char inMods) {
+  return KeyboardEvent(inAction, 9, 9, ModifierKeys(inMods), false, OS_Event());
+}
+
+TEST_F(FocusAdvanceTest, TabKeyDownAdvancesFromTheTargetAndIsHandled) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  AddView(*mWindow, "b");
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), a.get(), TabKey(KeyboardEvent::kActionKeyDown, 0)));
+  EXPECT_EQ(FocusLeafID(), "b");
+}
+
+TEST_F(FocusAdvanceTest, ShiftTabGoesBackAndCapsLockIsIgnored) {
+  AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  AddView(*mWindow, "c");
+  b->UI_GainKeyboardFocus(kFocusChangeMouse);
+  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), b.get(),
+                                                 TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyCapsLock)));
+  EXPECT_EQ(FocusLeafID(), "a");
+}
+
+TEST_F(FocusAdvanceTest, OtherKeysModifiersAndActionsAreNotTaken) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  AddView(*mWindow, "b");
+  a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  UI_Node* w = mWindow.get();
+  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(w, a.get(), TabKey(KeyboardEvent::kActionKeyUp, 0)));
+  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(w, a.get(), TabKey(KeyboardEvent::kActionKeyDown, kModKeyCtrl)));
+  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(
+      w, a.get(), TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyAlt)));
+  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(
+      w, a.get(), KeyboardEvent(KeyboardEvent::kActionKeyDown, 'A', 65, ModifierKeys(), false, OS_Event())));
+  EXPECT_EQ(FocusLeafID(), "a");
+}
+
+TEST_F(FocusAdvanceTest, WithoutATargetParentTheWalkStartsInTheGivenContainer) {
+  AddView(*mWindow, "a");
+  AddView(*mWindow, "b");
+  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), nullptr, TabKey(KeyboardEvent::kActionKeyDown, 0)));
+  EXPECT_EQ(FocusLeafID(), "b");  // from child 0 forward
+}
+
+// ---------------------------------------------------------------- generated trees
+
+// Builds a random tree of panels (which never take focus, and may be empty)
+// and focusable leaves; returns the leaves in document order.
+void BuildRandomTree(UI_Node& ioParent, std::mt19937& ioRandom, int inDepth, std::vector<std::string>& outLeaves,
+                     int& ioCounter) {
+  const int children = std::uniform_int_distribution<int>(0, 4)(ioRandom);
+  for (int i = 0; i < children; ++i) {
+    const std::string id = std::to_string(ioCounter++);
+    if (inDepth < 4 && std::uniform_int_distribution<int>(0, 2)(ioRandom) == 0) {
+      FocusableViewP panel = AddPanel(ioParent, "panel" + id);
+      BuildRandomTree(*panel, ioRandom, inDepth + 1, outLeaves, ioCounter);
+    } else {
+      AddView(ioParent, "leaf" + id);
+      outLeaves.push_back("leaf" + id);
+    }
+  }
+}
+
+UI_Node* FindByID(UI_Node& inRoot, const std::string& inID) {
+  for (auto it = inRoot.ChildBegin(); it != inRoot.ChildEnd(); ++it) {
+    if (std::string((*it)->UI_GetNodeID().c_str()) == inID) return it->get();
+    if (UI_Node* found = FindByID(**it, inID)) return found;
+  }
+  return nullptr;
+}
+
+TEST_F(FocusAdvanceTest, InRandomTreesTabVisitsEveryLeafInDocumentOrderAndShiftTabInReverse) {
+  std::mt19937 random(20261122);
+  for (int round = 0; round < 40; ++round) {
+    mWindow->DeleteChildren();
+    std::vector<std::string> leaves;
+    int counter = 0;
+    BuildRandomTree(*mWindow, random, 0, leaves, counter);
+    if (leaves.empty()) continue;
+    FindByID(*mWindow, leaves.front())->UI_GainKeyboardFocus(kFocusChangeMouse);
+    for (std::size_t step = 1; step <= leaves.size(); ++step) {
+      ASSERT_TRUE(Tab()) << "round " << round;
+      ASSERT_EQ(FocusLeafID(), leaves[step % leaves.size()]) << "round " << round << " step " << step;
+    }
+    for (std::size_t step = 1; step <= leaves.size(); ++step) {
+      ASSERT_TRUE(Tab(false)) << "round " << round;
+      ASSERT_EQ(FocusLeafID(), leaves[(leaves.size() * 2 - step) % leaves.size()])
+          << "round " << round << " back step " << step;
+    }
+  }
+}
+
+}  // namespace
+}  // namespace norvik::ui
