@@ -114,14 +114,17 @@ class UI_Node : public UI_NodeBase {
   virtual bool UI_UseDrawbotCache(drawbot::Drawbot* inDrawbot) const;
   virtual void UI_GetDrawSegments(std::vector<RectL>& outSegments) const;
   virtual drawbot::SupplierInterface* UI_GetDrawSupplier() const;
-  virtual bool UI_DoPreMouseEvent(const MouseEvent&) { return false; }
-  virtual bool UI_DoMouseEvent(const MouseEvent&) { return false; }
+  // In the event handlers, inTarget is the leaf the event went to (null on the
+  // first-chance pass) and the position is in this node's coordinates.
+  virtual bool UI_DoPreMouseEvent(UI_Node* /*inTarget*/, const MouseEvent&) { return false; }
+  virtual bool UI_DoMouseEvent(UI_Node* /*inTarget*/, const MouseEvent&) { return false; }
   virtual bool UI_DoMouseActivate(const MouseEvent&) { return false; }
-  virtual bool UI_DoCursor(const PointF&, ModKeys) { return false; }
-  virtual bool UI_InvalidateOnMouseOverChange() const { return false; }
-  virtual bool UI_IsMouseOver() const;
-  virtual bool UI_DoPreKeyboardEvent(const KeyboardEvent&) { return false; }
-  virtual bool UI_DoKeyboardEvent(const KeyboardEvent&) { return false; }
+  virtual bool UI_DoCursor(UI_Node* /*inTarget*/, const PointF&, ModKeys) { return false; }
+  virtual bool UI_InvalidateOnMouseOverChange(bool /*inIsLeaf*/) const { return false; }
+  // State flag 2; with inLeafOnly also that this node is the mouse-over leaf.
+  virtual bool UI_IsMouseOver(bool inLeafOnly = false) const;
+  virtual bool UI_DoPreKeyboardEvent(UI_Node* /*inTarget*/, const KeyboardEvent&) { return false; }
+  virtual bool UI_DoKeyboardEvent(UI_Node* /*inTarget*/, const KeyboardEvent&) { return false; }
   virtual bool UI_InvalidateOnKeyboardFocusChange(bool /*inIsLeaf*/) const { return false; }
   virtual bool UI_WantsKeyboardFocus() const { return false; }
   virtual bool UI_WantsKeyboardFocusFromAdvance() const { return false; }
@@ -162,7 +165,7 @@ class UI_Node : public UI_NodeBase {
   virtual void UI_DisabledStateChanged();
   virtual void UI_NodeChanged(NodeChange) {}
   virtual void UI_HandleOSEvent(OS_Event* inEvent) = 0;
-  // The cursor walk belongs to event dispatch; a node with nothing to dispatch to answers false.
+  // The cursor walk: an active capture, then towards the leaf and back to the root.
   virtual bool UI_DispatchCursor(const PointF& inPoint, ModKeys inModKeys, bool inSkipOSChildren);
   virtual bool UI_DispatchEvent(OS_Event* inEvent) = 0;
   virtual bool UI_DispatchKeyboardCharEventToParent() const { return true; }
@@ -172,7 +175,9 @@ class UI_Node : public UI_NodeBase {
   virtual void UI_SetKeyboardFocusWithOS() = 0;
   virtual void UI_ClearKeyboardFocusWithOS() {}
   virtual bool UI_IsDrawbotCacheValid(const drawbot::SurfaceInterface& inSurface) const;
-  virtual UI_Node* UI_GetMouseProxy() { return this; }
+  // The node that receives this node's mouse events; it may rewrite ioEvent
+  // (which may be null) for the proxy.
+  virtual UI_Node* UI_GetMouseProxy(MouseEvent* /*ioEvent*/) { return this; }
   virtual UI_NodeTimerManager* UI_GetTimerManager(bool inFlag);
   virtual const UI_NodeTimerManager* UI_GetTimerManager(bool inFlag) const;
   virtual bool UI_DisplaysToolTipForChild(const UI_Node*) const { return false; }
@@ -291,6 +296,49 @@ class UI_Node : public UI_NodeBase {
   // On the window that received a timer message: routes the timer with key
   // inTimerKey to its node; false when it is not one of this window's.
   bool UI_DispatchPossibleTimer(long inTimerKey);
+
+  // ---- mouse dispatch ----
+  using NodeChain = std::vector<UI_NodeP>;
+  // Entry from a native window: the mouse proxy's copy of the event goes to
+  // UI_DispatchMouseEventToTarget.
+  bool UI_DispatchMouseEvent(const MouseEvent& inEvent, bool inSkipOSChildren);
+  // The recorder, an active capture, then towards the leaf and back to the root.
+  static bool UI_DispatchMouseEventToTarget(UI_Node* inNode, const MouseEvent& inEvent, bool inSkipOSChildren);
+  // Answers whether a node handled the event, and the deepest node hit.
+  std::pair<bool, UI_NodeP> UI_DispatchMouseEventTowardsLeaf(const MouseEvent& inEvent, bool inSkipOSChildren);
+  bool UI_DispatchMouseEventTowardsRoot(UI_Node* inLeaf, const MouseEvent& inEvent);
+  // The custom mouse function, then UI_DoMouseEvent.
+  static bool UI_DispatchMouseEventToLeaf(UI_Node* inNode, UI_Node* inLeaf, const MouseEvent& inEvent);
+  // The mouse filters, newest first.
+  static bool UI_DispatchPreMouseEvent(UI_Node* inLeaf, const MouseEvent& inEvent);
+  static bool UI_DispatchCapturedMouseEvent(UI_Node* inNode, const MouseEvent& inEvent);
+
+  // ---- mouse over ----
+  void UI_UpdateMouseOverState(const MouseEvent& inEvent);
+  // Makes this node the mouse-over leaf; inEvent, in this node's coordinates,
+  // is what the nodes that the mouse leaves hear.
+  void UI_SetMouseOverLeafNode(const MouseEvent* inEvent);
+  // Enters or leaves the nodes [inFirst, inLast) of a root-first chain;
+  // inEvent's position is global here.
+  static void UI_SetMouseOverState(bool inEntering, const MouseEvent* inEvent, NodeChain::const_iterator inFirst,
+                                   NodeChain::const_iterator inLast, UI_Node* inLeaf);
+  // The mouse left inNode's native window; inEvent is in inNode's coordinates.
+  static void UI_MouseExited(const MouseEvent* inEvent, UI_Node* inNode);
+  static void UI_InvalidateMouseOverNodes();
+
+  // ---- cursor ----
+  std::pair<bool, UI_NodeP> UI_DispatchCursorTowardsLeaf(const PointF& inPoint, ModKeys inModKeys,
+                                                         bool inSkipOSChildren);
+  bool UI_DispatchCursorTowardsRoot(UI_Node* inLeaf, const PointF& inPoint, ModKeys inModKeys);
+  static bool UI_DispatchCapturedCursor(UI_Node* inNode, const PointF& inPoint, ModKeys inModKeys);
+
+  // ---- keyboard dispatch ----
+  // The recorder, the modifier notifier, an active capture, the keyboard
+  // filters, then inNode and each ancestor until one handles the key.
+  static bool UI_DispatchKeyboardEvent(UI_Node* inNode, const KeyboardEvent& inEvent);
+  // The custom keyboard function, then UI_DoKeyboardEvent.
+  static bool UI_DispatchKeyboardEventToNode(UI_Node* inNode, UI_Node* inTarget, const KeyboardEvent& inEvent);
+  static bool UI_DispatchCapturedKeyboardEvent(UI_Node* inNode, const KeyboardEvent& inEvent);
 
   // ---- tool tips ----
   // The node whose tip shows for inNode: inNode itself when it has a tip, else

@@ -40,6 +40,7 @@ namespace norvik::ui {
 class UI_Node;
 using UI_NodeP = boost::intrusive_ptr<UI_Node>;
 class OS_EditText;
+class KeyboardEvent;
 class OS_FocusPlatform;
 
 class UI_NodeManager : private boost::noncopyable {
@@ -129,6 +130,17 @@ class UI_NodeManager : private boost::noncopyable {
   void BeginInputCapture(const InputCaptureP& inCapture);
   // Ends the active capture, if any, after taking it out of the manager.
   void EndInputCapture(bool inCancelled);
+  // The capture, or null when there is none, when it has been cancelled, or
+  // when inNode is given and is not the capture's node.
+  InputCapture* GetActiveInputCapture(const UI_Node* inNode) const;
+
+  // ---- keyboard ----
+  // Refreshes the cursor when the modifiers changed, then runs the keyboard
+  // filters, newest first; true when one of them took the key.
+  bool DispatchPreKeyboardEvent(UI_Node* inTarget, const KeyboardEvent& inEvent);
+  // Whether a key activates a focused control: Space, or Ctrl with Return or
+  // the keypad's Enter, going down; Space, Return or Enter coming up.
+  static bool CompareControlActivateShortcut(const KeyboardEvent& inEvent);
 
   // ---- filters: newest first; a null node is ignored ----
   void AddMouseEventFilterNode(UI_Node* inNode);

@@ -169,8 +169,6 @@ bool UI_Node::UI_AreAllParentsVisible() const {
   return parent && parent->UI_AreAllParentsVisible();
 }
 
-bool UI_Node::UI_IsMouseOver() const { return mStateFlags.Test(kStateMouseOver); }
-
 // The draw traversal is added with the drawing of nodes; until then a node draws nothing.
 void UI_Node::UI_Draw(drawbot::Drawbot*) {}
 
@@ -211,8 +209,6 @@ bool UI_Node::UI_HandleDrop(const PointF&, datatransfer::OS_ReceiveData*, unsign
   outEffect = 0;
   return false;
 }
-
-bool UI_Node::UI_DispatchCursor(const PointF&, ModKeys, bool) { return false; }
 
 void UI_Node::UI_GetOSControlClipRects(OSControlClipRects& ioRects) const {
   for (const UI_NodeP& child : mChildren) child->UI_GetOSControlClipRects(ioRects);

@@ -83,7 +83,11 @@ void UI_NodeManager::EndInputCapture(bool inCancelled) {
   // Taken out first: calls made from the capture's End see no capture.
   InputCaptureP capture;
   capture.swap(mInputCapture);
-  if (capture) capture->InvokeEnd(inCancelled);
+  if (!capture) return;
+  capture->InvokeEnd(inCancelled);
+  capture.reset();
+  // Hover states may have changed while the gesture had the mouse.
+  UI_Node::UI_InvalidateMouseOverNodes();
 }
 
 // --------------------------------------------------------------------- filters
