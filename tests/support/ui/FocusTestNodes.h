@@ -51,8 +51,14 @@ class TestWindowNode : public FocusLogging<UI_SubView> {
     UI_SetLocalRectF(RectF(0, 0, 800, 600));
     UI_Show(true);
   }
-  // Children leave while the timer manager is still there, as in a native window.
-  ~TestWindowNode() override { DeleteChildren(); }
+  // The children's timers end while the timer manager is still there, as in a
+  // native window. (Detaching the children here would hand them focus back to
+  // this dying node.)
+  ~TestWindowNode() override {
+    for (auto it = ChildBegin(); it != ChildEnd(); ++it) {
+      if ((*it)->UI_IsSubView()) static_cast<UI_SubView*>(it->get())->UI_RemoveSubViewTimers();
+    }
+  }
 
   bool UI_AreAllParentsVisible() const override { return UI_IsShown(); }
   UI_NodeTimerManager* UI_GetTimerManager(bool) override { return &mTimers; }
