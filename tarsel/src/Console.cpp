@@ -178,11 +178,13 @@ bool Initialize() {
 
 void Terminate() {
   Registry& registry = GetRegistry();
+  bool wasInitialized;
   {
     std::lock_guard<std::mutex> lock(registry.mMutex);
-    NRK_CONTRACT(registry.mInitializeCount > 0);
-    if (--registry.mInitializeCount > 0) return;
+    wasInitialized = registry.mInitializeCount > 0;
+    if (wasInitialized && --registry.mInitializeCount > 0) return;
   }
+  NRK_CONTRACT(wasInitialized);  // outside the lock: the report may reach a console command
   CommandRegistry::UnregisterAll();
   ConsoleLogFile::GetInstance().CloseLogFile();
 }

@@ -113,12 +113,16 @@ void ErrorManager::BeginPaint() {
 
 void ErrorManager::EndPaint() {
   std::vector<ErrorReport> held;
+  bool wasPainting;
   {
     std::lock_guard<std::mutex> lock(mMutex);
-    NRK_CONTRACT(mPaintDepth > 0);
-    if (--mPaintDepth > 0) return;
+    wasPainting = mPaintDepth > 0;
+    if (wasPainting && --mPaintDepth > 0) return;
     held.swap(mHeldDuringPaint);
   }
+  // Checked outside the lock: the report traces, and a trace handler may
+  // well ask the manager something.
+  NRK_CONTRACT(wasPainting);
   for (const ErrorReport& report : held) ReportError(report);
 }
 

@@ -138,6 +138,24 @@ TEST_F(ErrorManagerTest, EndingAPaintThatNeverBeganIsAContractViolation) {
   EXPECT_EQ(mManager->GetPaintDepth(), 0);
 }
 
+namespace {
+// Asks the manager for its paint depth from inside every trace, as a console
+// showing the state of the application might.
+class InquisitiveTraceHandler : public tarsel::debug::TraceHandler {
+ public:
+  void Trace(const UTF8String&) override { mDepths.push_back(ErrorManager::Get(true)->GetPaintDepth()); }
+  std::vector<int> mDepths;
+};
+}  // namespace
+
+TEST_F(ErrorManagerTest, ATraceHandlerMayAskTheManagerWhileAPaintViolationIsReported) {
+  InquisitiveTraceHandler handler;
+  tarsel::debug::TraceHandler* previous = tarsel::debug::InstallMasterTraceHandler(&handler);
+  EXPECT_THROW(mManager->EndPaint(), tarsel::config::Exception);
+  tarsel::debug::InstallMasterTraceHandler(previous);
+  EXPECT_EQ(handler.mDepths, (std::vector<int>{0}));
+}
+
 TEST_F(ErrorManagerTest, ADeferredReporterHoldsErrorsUntilItsScopeEnds) {
   {
     DeferredErrorReporter deferred;

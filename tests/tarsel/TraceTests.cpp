@@ -54,6 +54,7 @@ TEST(Trace, ALevelGoesOutOnlyWhenTheVolumeReachesIt) {
 TEST(Trace, TheMacroDoesNotBuildItsTextForASilentCategory) {
   TraceRecorder trace;
   const std::string cat = Cat("macro");
+  SetTraceVolume(cat, 0);
   int built = 0;
   auto text = [&] { ++built; return std::string("expensive"); };
   NRK_TRACE(cat, text());
@@ -62,6 +63,7 @@ TEST(Trace, TheMacroDoesNotBuildItsTextForASilentCategory) {
   NRK_TRACE(cat, text());
   EXPECT_EQ(built, 1);
   EXPECT_TRUE(trace.Contains("expensive"));
+  SetTraceVolume(cat, 0);
 }
 
 TEST(Trace, CategoriesBecomeKnownWhenTracedOrSetAndAreListedSorted) {
