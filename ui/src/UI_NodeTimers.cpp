@@ -7,6 +7,7 @@
 // its notification keeps answering true.
 #include <utility>
 
+#include "ui/InputCapture.h"
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
 #include "ui/UI_NodeTimerManager.h"
@@ -67,6 +68,11 @@ bool UI_Node::UI_DispatchPossibleTimer(long inTimerKey) {
   UI_NodeProtector protect(this);
 
   UI_NodeManager* manager = UI_NodeManager::Get();
+  // A gesture on the node sees the node's timers first (auto-repeat, scrolling).
+  if (manager) {
+    const InputCaptureP capture(manager->GetActiveInputCapture(node.get()));
+    if (capture && capture->DoTimerNotify(timerID)) return true;
+  }
 
   if (timerID == UI_NodeManager::GetTooltipTimerID()) {
     DispatchToolTipTimer(node.get(), manager);
