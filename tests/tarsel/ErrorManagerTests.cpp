@@ -1,5 +1,9 @@
 #include <gtest/gtest.h>
 
+#include <sys/ptrace.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
 #include <cstring>
 #include <stdexcept>
 #include <thread>
@@ -276,4 +280,27 @@ TEST(Contract, AKeptContractCostsNothingAndReportsNothing) {
   EXPECT_NO_THROW(NRK_CONTRACT(1 + 1 == 2));
   EXPECT_EQ(tarsel::debug::GetContractViolationCount(), before);
   EXPECT_TRUE(trace.Lines().empty());
+}
+
+namespace {
+// Runs IsDebuggerAttached in a child process, traced by this one or not, and
+// answers the child's exit code: 1 attached, 0 not, 2 when tracing is not
+// permitted here.
+int DebuggerCheckInChild(bool inTraced) {
+  pid_t child = ::fork();
+  if (child == 0) {
+    if (inTraced && ::ptrace(PTRACE_TRACEME, 0, nullptr, nullptr) != 0) ::_exit(2);
+    ::_exit(tarsel::debug::IsDebuggerAttached() ? 1 : 0);
+  }
+  int status = 0;
+  ::waitpid(child, &status, 0);
+  return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+}
+}  // namespace
+
+TEST(Contract, ADebuggerIsSeenOnlyWhenAProcessIsTraced) {
+  EXPECT_EQ(DebuggerCheckInChild(false), 0);
+  const int traced = DebuggerCheckInChild(true);
+  if (traced == 2) GTEST_SKIP() << "tracing is not permitted in this environment";
+  EXPECT_EQ(traced, 1);
 }
