@@ -33,7 +33,7 @@
 //
 // Points are arrays of two numbers (x, y), rectangles arrays of four (left,
 // top, width, height): signed 32-bit integers for the "32" forms and 32-bit
-// floats for the "F32" forms.
+// floats for the "F32" forms. The integer writers clamp to the 32-bit range.
 #include <cstdint>
 #include <string>
 #include <string_view>

@@ -79,6 +79,10 @@ class PropListHandler final : public xml::AbstractParseHandler {
   Scalar ReadFloatType(const xml::Attributes& inAttributes) const;
   bool StartValue(std::string_view inName, const xml::Attributes& inAttributes, Kind& outKind,
                   Scalar& outScalar) const;
+  void StartMap(std::string_view inName, const xml::Attributes& inAttributes);
+  // Each answers false when the element does not belong where it stands.
+  bool StartInPair(std::string_view inName, const xml::Attributes& inAttributes);
+  bool StartInArray(std::string_view inName, const xml::Attributes& inAttributes);
   void StartInArrayType(std::string_view inName, const xml::Attributes& inAttributes);
   PropValue ParseScalar(Scalar inType, const std::string& inText) const;
   void Deliver(PropValue&& inValue);
@@ -190,90 +194,103 @@ void PropListHandler::StartInArrayType(std::string_view inName, const xml::Attri
   Push(Kind::kTypeName, scalar);
 }
 
-void PropListHandler::StartElement(std::string_view inName, const xml::Attributes& inAttributes) {
-  if (mStack.empty()) {
-    if (inName != "prop.map" || mHasMap) {
-      Fail("$$$/tarsel/proplist/Error/NotAPropList=Property list error at line ^0: "
-           "the document is not a property list (it starts with \"^1\").",
-           inName);
-    }
-    CheckAttributes(inName, inAttributes, {"version"});
-    const UTF8String* version = inAttributes.Find("version");
-    if (!version || version->size() != 1 || (*version)[0] < '1' || (*version)[0] > '4') {
-      Fail("$$$/tarsel/proplist/Error/BadVersion=Property list error at line ^0: "
-           "prop.map version \"^1\" is not supported.",
-           version ? *version : UTF8String());
-    }
-    mHasMap = true;
-    Push(Kind::kMap);
-    return;
+void PropListHandler::StartMap(std::string_view inName, const xml::Attributes& inAttributes) {
+  if (inName != "prop.map" || mHasMap) {
+    Fail("$$$/tarsel/proplist/Error/NotAPropList=Property list error at line ^0: "
+         "the document is not a property list (it starts with \"^1\").",
+         inName);
   }
-  const Kind parent = mStack.back().kind;
+  CheckAttributes(inName, inAttributes, {"version"});
+  const UTF8String* version = inAttributes.Find("version");
+  if (!version || version->size() != 1 || (*version)[0] < '1' || (*version)[0] > '4') {
+    Fail("$$$/tarsel/proplist/Error/BadVersion=Property list error at line ^0: "
+         "prop.map version \"^1\" is not supported.",
+         version ? *version : UTF8String());
+  }
+  mHasMap = true;
+  Push(Kind::kMap);
+}
+
+bool PropListHandler::StartInPair(std::string_view inName, const xml::Attributes& inAttributes) {
+  const Frame& pair = mStack.back();
+  if (inName == "key") {
+    CheckAttributes(inName, inAttributes, {});
+    if (pair.hasKey || pair.hasValue) {
+      Fail("$$$/tarsel/proplist/Error/MisplacedKey=Property list error at line ^0: "
+           "a key must come once, before the value.");
+    }
+    Push(Kind::kKey);
+    return true;
+  }
   Kind kind = Kind::kMap;
   Scalar scalar = Scalar::kString;
-  switch (parent) {
+  if (!StartValue(inName, inAttributes, kind, scalar)) return false;
+  if (!pair.hasKey) {
+    Fail("$$$/tarsel/proplist/Error/MissingKey=Property list error at line ^0: a pair has a value before its key.");
+  }
+  Push(kind, scalar);
+  mStack.back().truth = inName == "true";
+  return true;
+}
+
+bool PropListHandler::StartInArray(std::string_view inName, const xml::Attributes& inAttributes) {
+  const Frame& array = mStack.back();
+  if (!array.hasValue) {
+    if (inName != "array.type") return false;
+    CheckAttributes(inName, inAttributes, {});
+    Push(Kind::kArrayType);
+    return true;
+  }
+  Kind kind = Kind::kMap;
+  Scalar scalar = Scalar::kString;
+  if (!StartValue(inName, inAttributes, kind, scalar)) return false;
+  if (kind != Kind::kScalar || scalar != array.scalar) {
+    Fail("$$$/tarsel/proplist/Error/ArrayEntryType=Property list error at line ^0: "
+         "the entry \"^1\" does not match the type of its array.",
+         inName);
+  }
+  Push(kind, scalar);
+  return true;
+}
+
+void PropListHandler::StartElement(std::string_view inName, const xml::Attributes& inAttributes) {
+  if (mStack.empty()) {
+    StartMap(inName, inAttributes);
+    return;
+  }
+  bool accepted = false;
+  switch (mStack.back().kind) {
     case Kind::kMap:
       if (inName == "prop.list" && !mHasList) {
         CheckAttributes(inName, inAttributes, {});
         mHasList = true;
         Push(Kind::kList);
-        return;
+        accepted = true;
       }
       break;
     case Kind::kList:
       if (inName == "prop.pair") {
         CheckAttributes(inName, inAttributes, {});
         Push(Kind::kPair);
-        return;
+        accepted = true;
       }
       break;
-    case Kind::kPair:
-      if (inName == "key") {
-        CheckAttributes(inName, inAttributes, {});
-        if (mStack.back().hasKey || mStack.back().hasValue) {
-          Fail("$$$/tarsel/proplist/Error/MisplacedKey=Property list error at line ^0: "
-               "a key must come once, before the value.");
-        }
-        Push(Kind::kKey);
-        return;
-      }
-      if (StartValue(inName, inAttributes, kind, scalar)) {
-        if (!mStack.back().hasKey) {
-          Fail("$$$/tarsel/proplist/Error/MissingKey=Property list error at line ^0: a pair has a value before its key.");
-        }
-        Push(kind, scalar);
-        mStack.back().truth = inName == "true";
-        return;
-      }
-      break;
-    case Kind::kArray:
-      if (inName == "array.type" && !mStack.back().hasValue) {
-        CheckAttributes(inName, inAttributes, {});
-        Push(Kind::kArrayType);
-        return;
-      }
-      if (mStack.back().hasValue && StartValue(inName, inAttributes, kind, scalar)) {
-        if (kind != Kind::kScalar || scalar != mStack.back().scalar) {
-          Fail("$$$/tarsel/proplist/Error/ArrayEntryType=Property list error at line ^0: "
-               "the entry \"^1\" does not match the type of its array.",
-               inName);
-        }
-        Push(kind, scalar);
-        return;
-      }
-      break;
+    case Kind::kPair: accepted = StartInPair(inName, inAttributes); break;
+    case Kind::kArray: accepted = StartInArray(inName, inAttributes); break;
     case Kind::kArrayType:
       StartInArrayType(inName, inAttributes);
-      return;
+      accepted = true;
+      break;
     case Kind::kKey:
     case Kind::kScalar:
     case Kind::kBool:
-    case Kind::kTypeName:
-      break;
+    case Kind::kTypeName: break;
   }
-  Fail("$$$/tarsel/proplist/Error/UnexpectedElement=Property list error at line ^0: "
-       "the element \"^1\" is not allowed here.",
-       inName);
+  if (!accepted) {
+    Fail("$$$/tarsel/proplist/Error/UnexpectedElement=Property list error at line ^0: "
+         "the element \"^1\" is not allowed here.",
+         inName);
+  }
 }
 
 void PropListHandler::Characters(std::string_view inText) {
