@@ -166,3 +166,40 @@ TEST(Baseline, TheSettingMakesTheBaselineFollowAscentAndDescent) {
 
 }  // namespace
 }  // namespace norvik::drawbot
+
+namespace norvik::drawbot {
+namespace {
+
+TEST(MultiLineText, NarrowerBoxesWrapIntoMoreLines) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
+  UTF16String text = u"The quick brown fox jumps over the lazy dog";
+  float wide = font->MeasureMultiLineStringHeight(Chars(text), 1000, -1);
+  float narrow = font->MeasureMultiLineStringHeight(Chars(text), 60, -1);
+  EXPECT_GT(wide, 10);
+  EXPECT_GE(narrow, 3 * wide);
+}
+
+TEST(MultiLineText, WrappedTextStaysInsideItsRectangle) {
+  PixelCanvas canvas(100, 80);
+  FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 12);
+  BrushP brush(canvas.GetSupplier(), ColorRGBA(0, 0, 0, 1));
+  canvas.GetSurface()->DrawMultiLineString(*brush, *font, Chars(u"Render the whole timeline again"),
+                                           RectT<float>(10, 5, 60, 70), kTextAlignLeft);
+  auto image = canvas.Snapshot();
+  auto [left, right] = InkColumns(image);
+  auto [top, bottom] = InkRows(image);
+  EXPECT_GE(left, 10);
+  EXPECT_LT(right, 70);
+  EXPECT_GE(top, 5);
+  EXPECT_GT(bottom - top, 30);  // more than two lines
+}
+
+TEST(MultiLineText, AnUnknownTextDisplayPolicyIsRefused) {
+  SurfaceP surface(NewOSSupplier(), 10, 10);
+  EXPECT_THROW(surface->SetTextDisplayPolicy(static_cast<TextDisplayPolicy>(4)), tarsel::config::Exception);
+  surface->SetTextDisplayPolicy(kTextDisplaySmooth);
+  EXPECT_EQ(surface->GetTextDisplayPolicy(), kTextDisplaySmooth);
+}
+
+}  // namespace
+}  // namespace norvik::drawbot

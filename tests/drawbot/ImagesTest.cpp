@@ -8,6 +8,7 @@
 
 #include <filesystem>
 
+#include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/drawbot/RecordingSupplier.h"
@@ -192,6 +193,31 @@ TEST(SurfaceImages, ABufferedSurfaceReachesItsTargetOnFlush) {
     EXPECT_EQ(cairo_image_surface_get_data(target)[4 * 4 + 3], 0);
   }
   cairo_surface_destroy(target);
+}
+
+TEST(SurfaceImages, WithAFlashDelayTheTargetStillEndsWithTheDrawing) {
+  cairo_surface_t* target = cairo_image_surface_create(CAIRO_FORMAT_ARGB32, 4, 1);
+  SetRedrawDebugFlashDelay(1);
+  {
+    OSSurfaceP surface(NewOSSupplier(), target, nullptr, true);
+    surface->PaintRect(ColorRGBA(0, 1, 0, 1), RectT<float>(0, 0, 2, 1));
+    surface->Flush();
+  }
+  SetRedrawDebugFlashDelay(0);
+  cairo_surface_flush(target);
+  auto const* pixels = reinterpret_cast<uint32_t const*>(cairo_image_surface_get_data(target));
+  EXPECT_EQ(pixels[0], 0xff00ff00u);
+  EXPECT_EQ(pixels[3], 0u);  // the flash does not stay behind
+  cairo_surface_destroy(target);
+}
+
+TEST(BufferImages, TwentyFourBitPixelsAreDrawnOpaque) {
+  unsigned char pixels[8] = {10, 20, 30, 40, 50, 60, 0, 0};  // B, G, R per pixel, rows of 8 bytes
+  PixelCanvas canvas(2, 1);
+  BufferImageP image(canvas.GetSupplier(), 2, 1, 8, kPixelLayoutRGB24, pixels, nullptr);
+  canvas.GetSurface()->DrawImage(*image, PointT<float>(0, 0), 1);
+  EXPECT_EQ(canvas.Snapshot().At(0, 0), 0xff1e140au);
+  EXPECT_EQ(canvas.Snapshot().At(1, 0), 0xff3c3228u);
 }
 
 }  // namespace
