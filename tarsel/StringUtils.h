@@ -31,6 +31,9 @@ void ToUpperCase(UTF8String& ioText);
 // word is a run of letters, digits and apostrophes.
 void ToTitleCase(UTF16String& ioText);
 
+// UTF-8 text is mapped through UTF-16; broken UTF-8 sequences come back as
+// U+FFFD.
+
 // Copies.
 UTF16String LowerCase(std::u16string_view inText);
 char16_t LowerCase(char16_t inChar);
@@ -135,6 +138,12 @@ using NumberFormatFlags = Flags<unsigned short>;
 // Plain decimal digits with a leading '-' when negative.
 UTF16String NumberToString(long inValue);
 UTF16String NumberToString(long long inValue);
+UTF16String NumberToString(unsigned long long inValue);
+inline UTF16String NumberToString(int inValue) { return NumberToString(static_cast<long>(inValue)); }
+inline UTF16String NumberToString(unsigned inValue) { return NumberToString(static_cast<unsigned long long>(inValue)); }
+inline UTF16String NumberToString(unsigned long inValue) {
+  return NumberToString(static_cast<unsigned long long>(inValue));
+}
 // The shortest plain text that reads back as exactly inValue ("0.1", "1e+300"),
 // "NaN" for NaN and U+221E with its sign for infinities.
 UTF16String NumberToString(double inValue);
@@ -143,10 +152,11 @@ UTF16String NumberToString(double inValue);
 // shortest decimal form of the double, so that 1.005 gives "1.01" as a reader
 // expects). Negative decimal places round to tens, hundreds... and show no
 // fraction. inMinimumWidth is the least number of characters of the result,
-// padded as the flags say. inMaxFixedLength bounds the fixed-point text: a
+// padded as the flags say, up to kNumberMaxMinimumWidth. inMaxFixedLength bounds the fixed-point text: a
 // number that would need more characters (1e300 with no decimal places) is
 // written in scientific notation instead. Zero after rounding never has a
 // minus sign. Infinities are written as U+221E with their sign, NaN as "NaN".
+constexpr int kNumberMaxMinimumWidth = 1024;
 UTF16String NumberToString(double inValue, int inMinimumWidth, int inDecimalPlaces, NumberFormatFlags inFlags,
                            int inMaxFixedLength);
 

@@ -164,7 +164,8 @@ UTF16String SignFor(bool inNegative, NumberFormatFlags inFlags) {
 
 UTF16String Pad(const UTF16String& inSign, const UTF16String& inBody, int inMinimumWidth, NumberFormatFlags inFlags,
                 bool inNumeric) {
-  const long missing = static_cast<long>(inMinimumWidth) - static_cast<long>(inSign.size() + inBody.size());
+  const long width = std::min(inMinimumWidth, kNumberMaxMinimumWidth);
+  const long missing = width - static_cast<long>(inSign.size() + inBody.size());
   if (missing <= 0) return inSign + inBody;
   UTF16String padding(static_cast<std::size_t>(missing), u' ');
   if (inFlags.Test(kNumberFormatLeadingSpaces) || !inNumeric) return padding + inSign + inBody;
@@ -255,6 +256,7 @@ double ReadCheckedNumber(std::string_view inPlain, std::u16string_view inOrigina
 
 UTF16String NumberToString(long inValue) { return AsciiToUTF16(std::to_string(inValue)); }
 UTF16String NumberToString(long long inValue) { return AsciiToUTF16(std::to_string(inValue)); }
+UTF16String NumberToString(unsigned long long inValue) { return AsciiToUTF16(std::to_string(inValue)); }
 
 UTF16String NumberToString(double inValue) {
   if (std::isnan(inValue)) return u"NaN";

@@ -47,6 +47,13 @@ TEST(NumberToString, IntegersAndShortestDoubles) {
   EXPECT_EQ(NumberToString(-HUGE_VAL), u"-\u221E");
 }
 
+TEST(NumberToString, EveryIntegerTypeHasAnExactForm) {
+  EXPECT_EQ(NumberToString(3), u"3");
+  EXPECT_EQ(NumberToString(std::size_t{18446744073709551615u}), u"18446744073709551615");
+  EXPECT_EQ(NumberToString(4000000000u), u"4000000000");
+  EXPECT_EQ(NumberToString(-9007199254740993LL), u"-9007199254740993");
+}
+
 TEST(NumberToString, RoundsHalfAwayFromZeroOnTheDigitsAReaderSees) {
   EXPECT_EQ(Format(1.23456, 0, 2, 0), u"1.23");
   EXPECT_EQ(Format(1.005, 0, 2, 0), u"1.01");
@@ -89,6 +96,10 @@ TEST(NumberToString, MinimumWidthPadsWithZerosAfterTheSignOrWithSpacesBeforeIt) 
   EXPECT_EQ(Format(-7.5, 6, 1, kNumberFormatLeadingSpaces), u"  -7.5");
   EXPECT_EQ(Format(12345, 3, 0, 0), u"12345");
   EXPECT_EQ(Format(5, 1, 0, 0), u"5");
+  EXPECT_EQ(Format(5, -10, 0, 0), u"5");
+  // A hostile width is bounded instead of allocating gigabytes.
+  EXPECT_EQ(Format(5, 2000000000, 0, kNumberFormatLeadingSpaces).size(),
+            static_cast<std::size_t>(kNumberMaxMinimumWidth));
 }
 
 TEST(NumberToString, SignFlagsMarkNumbersThatAreNotNegative) {
