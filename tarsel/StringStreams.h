@@ -57,20 +57,28 @@ class oUTF8StringStream : public std::ostream {
 };
 
 // The receiving end of a UTF16OutputStream: gets the text in whole characters
-// each time the stream is flushed (std::endl, std::flush, or a full buffer).
+// when the stream's buffer fills up and when the stream is flushed
+// (std::endl, std::flush); after the text of an explicit flush comes Flush(),
+// the moment for a receiver that batches text to pass it on.
 class UTF16StreamSink {
  public:
   virtual ~UTF16StreamSink() = default;
   virtual void Write(std::u16string_view inText) = 0;
+  virtual void Flush() {}
 };
 
-// A stream that hands its text, converted to UTF-16, to a sink. A multi-byte
-// character cut by a flush is held back until its remaining bytes arrive.
-// Without a sink, text is dropped.
+// A stream for visible text: UTF-16 strings, narrow UTF-8 text and numbers go
+// in. It hands its text either, converted to UTF-16, to a sink, or, as UTF-8,
+// to a stream buffer of the caller's (as the debug and console streams take).
+// A multi-byte character cut by a flush is held back until its remaining bytes
+// arrive. Without a sink or buffer, text is dropped.
 class UTF16OutputStream : public std::ostream {
  public:
   explicit UTF16OutputStream(UTF16StreamSink* inSink = nullptr);
+  // Writes into inBuffer, which the caller keeps alive and owns.
+  explicit UTF16OutputStream(std::streambuf* inBuffer);
   ~UTF16OutputStream() override;
+  // Sends further text to inSink instead of wherever it went.
   void SetSink(UTF16StreamSink* inSink);
   UTF16StreamSink* GetSink() const;
 

@@ -47,13 +47,13 @@ UTF8String oUTF8StringStream::str() const {
 class UTF16OutputStream::Buffer : public std::streambuf {
  public:
   explicit Buffer(UTF16StreamSink* inSink) : mSink(inSink) { setp(mBytes, mBytes + sizeof(mBytes)); }
-  ~Buffer() override { sync(); }
+  ~Buffer() override { Drain(); }
 
   UTF16StreamSink* mSink;
 
  protected:
   int_type overflow(int_type inChar) override {
-    if (sync() != 0) return traits_type::eof();
+    Drain();
     if (!traits_type::eq_int_type(inChar, traits_type::eof())) {
       *pptr() = traits_type::to_char_type(inChar);
       pbump(1);
@@ -62,6 +62,13 @@ class UTF16OutputStream::Buffer : public std::streambuf {
   }
 
   int sync() override {
+    Drain();
+    if (mSink) mSink->Flush();
+    return 0;
+  }
+
+ private:
+  void Drain() {
     std::size_t size = static_cast<std::size_t>(pptr() - pbase());
     std::size_t complete = CompletePrefix(size);
     if (mSink && complete > 0) mSink->Write(utility::UTF8to16(std::string_view(mBytes, complete)));
@@ -69,10 +76,8 @@ class UTF16OutputStream::Buffer : public std::streambuf {
     for (std::size_t i = 0; i < rest; ++i) mBytes[i] = mBytes[complete + i];
     setp(mBytes, mBytes + sizeof(mBytes));
     pbump(static_cast<int>(rest));
-    return 0;
   }
 
- private:
   // The length of the buffer's prefix that ends on a character boundary: a
   // lead byte whose sequence is not yet complete stays behind.
   std::size_t CompletePrefix(std::size_t inSize) const {
@@ -97,11 +102,18 @@ UTF16OutputStream::UTF16OutputStream(UTF16StreamSink* inSink)
   imbue(std::locale::classic());
 }
 
+UTF16OutputStream::UTF16OutputStream(std::streambuf* inBuffer)
+    : std::ostream(nullptr), mBuffer(std::make_unique<Buffer>(nullptr)) {
+  rdbuf(inBuffer ? inBuffer : mBuffer.get());
+  imbue(std::locale::classic());
+}
+
 UTF16OutputStream::~UTF16OutputStream() { flush(); }
 
 void UTF16OutputStream::SetSink(UTF16StreamSink* inSink) {
   flush();
   mBuffer->mSink = inSink;
+  rdbuf(mBuffer.get());
 }
 
 UTF16StreamSink* UTF16OutputStream::GetSink() const { return mBuffer->mSink; }

@@ -15,8 +15,10 @@ class RecordingSink : public UTF16StreamSink {
     chunks.emplace_back(inText);
     all.append(inText.data(), inText.size());
   }
+  void Flush() override { flushedAt.push_back(all.size()); }
   std::vector<UTF16String> chunks;
   UTF16String all;
+  std::vector<std::size_t> flushedAt;
 };
 
 }  // namespace
@@ -104,4 +106,32 @@ TEST(UTF16OutputStream, WithoutASinkTextIsDroppedAndASinkCanBeSetLater) {
   out << "kept" << std::flush;
   EXPECT_EQ(sink.all, u"kept");
   out.SetSink(nullptr);
+}
+
+TEST(UTF16OutputStream, TheSinkHearsOfExplicitFlushesOnlyAfterTheirText) {
+  RecordingSink sink;
+  UTF16OutputStream out(&sink);
+  for (int i = 0; i < 600; ++i) out << "ab";  // fills the buffer: text, no flush
+  EXPECT_FALSE(sink.all.empty());
+  EXPECT_TRUE(sink.flushedAt.empty());
+  out << std::endl;
+  ASSERT_EQ(sink.flushedAt.size(), 1u);
+  EXPECT_EQ(sink.flushedAt[0], 1201u);
+}
+
+TEST(UTF16OutputStream, WritesUTF8IntoACallersStreamBuffer) {
+  std::stringbuf buffer;
+  {
+    UTF16OutputStream out(&buffer);
+    out << UTF16String(u"Pegel ") << -6.5 << " dB\u00B1";
+  }
+  EXPECT_EQ(buffer.str(), "Pegel -6.5 dB\u00B1");
+
+  // Switching to a sink leaves the caller's buffer alone from then on.
+  RecordingSink sink;
+  UTF16OutputStream out(&buffer);
+  out.SetSink(&sink);
+  out << "later" << std::flush;
+  EXPECT_EQ(sink.all, u"later");
+  EXPECT_EQ(buffer.str(), "Pegel -6.5 dB\u00B1");
 }
