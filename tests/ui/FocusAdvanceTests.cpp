@@ -225,6 +225,47 @@ TEST_F(FocusAdvanceTest, TabWeightsOrderTheWalk) {
   EXPECT_EQ(FocusLeafID(), "a");
 }
 
+TEST_F(FocusAdvanceTest, NextFocusIndexSortsByWeightThenIndexAndReportsWraps) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  FocusableViewP c = AddView(*mWindow, "c");
+  FocusableViewP d = AddView(*mWindow, "d");
+  a->UI_SetTabOrderWeight(5);
+  c->UI_SetTabOrderWeight(5);
+  // Sorted: b(0,1) d(0,3) a(5,0) c(5,2).
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, -1), std::make_pair(false, 1));
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(-1, -1), std::make_pair(false, 2));
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, 0), std::make_pair(false, 3));
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, 3), std::make_pair(true, 1));
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(-1, 0), std::make_pair(true, 2));
+  // The index is used as a position in the sorted order, so it is not
+  // symmetric once weights are in use: forward from b's index lands on d.
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, b->UI_GetIndex()), std::make_pair(false, 0));
+}
+
+TEST_F(FocusAdvanceTest, TheTabCacheFollowsChangesToTheChildren) {
+  FocusableViewP a = AddView(*mWindow, "a");
+  FocusableViewP b = AddView(*mWindow, "b");
+  b->UI_SetTabOrderWeight(0);
+  a->UI_SetTabOrderWeight(1);
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, -1), std::make_pair(false, 1));
+  FocusableViewP c = AddView(*mWindow, "c");  // weight 0, after b
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, 0), std::make_pair(false, 2));
+  mWindow->ChildRemove(b.get());
+  EXPECT_EQ(mWindow->UI_GetNextFocusIndex(1, -1), std::make_pair(false, 1));  // c, now at index 1
+}
+
+TEST_F(FocusAdvanceTest, AnOutOfRangeIndexStillLandsOnAChild) {
+  AddView(*mWindow, "a");
+  AddView(*mWindow, "b");
+  const auto next = mWindow->UI_GetNextFocusIndex(-1, -7);
+  EXPECT_GE(next.second, 0);
+  EXPECT_LT(next.second, 2);
+  const auto far = mWindow->UI_GetNextFocusIndex(1, 12345);
+  EXPECT_GE(far.second, 0);
+  EXPECT_LT(far.second, 2);
+}
+
 TEST_F(FocusAdvanceTest, AHandlerThatRemovesThePanelDuringTheWalkDoesNotCrash) {
   AddView(*mWindow, "a");
   FocusableViewP panel = AddPanel(*mWindow, "panel");
