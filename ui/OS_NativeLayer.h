@@ -63,7 +63,7 @@ using OS_RegionHandle = void*;
 // What BeginPaint gives: the target to draw on and the part to repaint.
 struct OS_PaintContext {
   void* target = nullptr;          // a drawbot::NativeDrawTarget for the supplier's NewSurface
-  OS_RegionHandle updateRegion = nullptr;
+  OS_RegionHandle updateRegion = nullptr;  // the platform's; EndPaint releases it
   OS_Rect updateBounds;
 };
 
@@ -72,6 +72,13 @@ struct OS_Monitor {
   OS_Rect bounds;
   OS_Rect workArea;
 };
+
+// Special places of SetWindowPos's inInsertAfter: the top or bottom of the
+// window's band, or moving a top level into or out of the topmost band.
+constexpr OS_WindowHandle kOSInsertTop = 0;
+constexpr OS_WindowHandle kOSInsertBottom = 1;
+constexpr OS_WindowHandle kOSInsertTopmost = static_cast<OS_WindowHandle>(-1);
+constexpr OS_WindowHandle kOSInsertNoTopmost = static_cast<OS_WindowHandle>(-2);
 
 using OS_CursorHandle = std::uintptr_t;
 using OS_TimerCallback = std::function<void()>;
@@ -232,5 +239,13 @@ class OS_NativeLayer {
 // destroying it. Null when none is installed.
 OS_NativeLayer* GetNativeLayer();
 void SetNativeLayer(OS_NativeLayer* inLayer);
+
+class OS_FocusPlatform;
+// Makes inLayer the toolkit's platform (null uninstalls): the native layer,
+// the input answers that read it, and the focus questions of the current
+// node manager. Create the manager first, or install again after creating it.
+void InstallNativeLayer(OS_NativeLayer* inLayer);
+// The focus questions answered through whatever native layer is installed.
+OS_FocusPlatform& GetNativeFocusPlatform();
 
 }  // namespace norvik::ui
