@@ -104,13 +104,25 @@ UTF16String GroupDigits(const std::string& inInteger, char16_t inMark) {
   return text;
 }
 
+// |inValue| in scientific notation with inDecimalPlaces digits after the
+// point, or with more where rounding would carry the number past the largest
+// double ("2e+308" for 1.79e308), since the text must read back.
+std::string ScientificText(double inValue, int inDecimalPlaces) {
+  char buffer[kMaxDecimalPlaces + 32];
+  for (int places = inDecimalPlaces;; ++places) {
+    auto result =
+        std::to_chars(buffer, buffer + sizeof(buffer), std::fabs(inValue), std::chars_format::scientific, places);
+    double back = 0;
+    if (std::from_chars(buffer, result.ptr, back).ec != std::errc::result_out_of_range || places >= 17) {
+      return std::string(buffer, result.ptr);
+    }
+  }
+}
+
 // The digits of |inValue| in scientific notation, for numbers too long to
 // write out: "1.5e+300".
 UTF16String ScientificBody(double inValue, int inDecimalPlaces, NumberFormatFlags inFlags, Marks inMarks) {
-  char buffer[kMaxDecimalPlaces + 32];
-  auto result = std::to_chars(buffer, buffer + sizeof(buffer), std::fabs(inValue), std::chars_format::scientific,
-                              inDecimalPlaces);
-  std::string text(buffer, result.ptr);
+  std::string text = ScientificText(inValue, inDecimalPlaces);
   std::size_t e = text.find('e');
   std::string mantissa = text.substr(0, e), exponent = text.substr(e);
   std::size_t dot = mantissa.find('.');

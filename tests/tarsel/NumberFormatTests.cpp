@@ -128,13 +128,23 @@ TEST(NumberToString, LocalisedFormUsesTheDefaultLocaleMarks) {
 }
 
 TEST(NumberToString, NumbersTooLongForFixedPointSwitchToScientific) {
-  UTF16String huge = Format(1.7976931348623157e308, 0, 2, 0);
-  EXPECT_EQ(huge, u"1.80e+308");
+  EXPECT_EQ(Format(1.5e300, 0, 2, 0), u"1.50e+300");
+  EXPECT_EQ(Format(-1.5e300, 0, 1, kNumberFormatUseSeparator), u"-1.5e+300");
   EXPECT_EQ(Format(1e40, 0, 0, 0), u"1e+40");
   EXPECT_EQ(Format(2.5e35, 0, 3, kNumberFormatNoTrailingZeros), u"2.5e+35");
   // The limit is the caller's: a generous one keeps fixed point.
   EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 100).size(), 41u);
   EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 0).size(), 41u);
+}
+
+TEST(NumberToString, TheLargestDoublesKeepTheDigitsTheyNeedToReadBack) {
+  // Rounding 1.797...e308 to "1.80e+308" would read back as out of range.
+  const double max = std::numeric_limits<double>::max();
+  UTF16String text = Format(max, 0, 2, 0);
+  EXPECT_EQ(text, u"1.79769e+308");
+  EXPECT_NEAR(StringToNumber(text, kPlain), max, max * 1e-5);
+  EXPECT_NEAR(StringToNumber(Format(-max, 0, 0, kNumberFormatUseSeparator), kPlain), -max, max * 1e-5);
+  EXPECT_EQ(StringToNumber(Format(1.797692920482154e308, 0, 0, 0), kPlain), 1.79769e308);
 }
 
 TEST(NumberToString, InfinityAndNaNAreWrittenAsSymbols) {
