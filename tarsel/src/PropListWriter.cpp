@@ -40,7 +40,14 @@ bool IsXmlChar(char32_t c) {
   return c != 0xFFFE && c != 0xFFFF;
 }
 
+bool IsPlainAscii(char32_t c) { return c >= 0x20 && c < 0x7F && c != '&' && c != '<' && c != '>'; }
+
 void AppendEscapedUTF16(std::string& out, std::u16string_view inText) {
+  // Most texts of a document are plain ASCII: copy those straight across.
+  if (std::all_of(inText.begin(), inText.end(), [](char16_t c) { return IsPlainAscii(c); })) {
+    for (char16_t c : inText) out.push_back(static_cast<char>(c));
+    return;
+  }
   UTF16String clean;
   clean.reserve(inText.size());
   for (std::size_t i = 0; i < inText.size(); ++i) {
@@ -70,10 +77,7 @@ void AppendEscapedUTF16(std::string& out, std::u16string_view inText) {
 }
 
 void AppendEscapedUTF8(std::string& out, std::string_view inText) {
-  const bool plain = std::all_of(inText.begin(), inText.end(), [](char c) {
-    return c >= 0x20 && c < 0x7F && c != '&' && c != '<' && c != '>';
-  });
-  if (plain) {
+  if (std::all_of(inText.begin(), inText.end(), [](char c) { return IsPlainAscii(static_cast<unsigned char>(c)); })) {
     out.append(inText);
     return;
   }
