@@ -22,7 +22,8 @@ using NativeRegion = void*;
 class SupplierInterface : public tarsel::utility::RefCountedObject {
  public:
   // A surface drawing onto a platform target, clipped to inRegion when given.
-  // With inBuffered the drawing goes to memory first and Flush copies it out.
+  // With inBuffered the drawing goes to memory first and Flush copies it out
+  // (for image targets; other targets are drawn on directly).
   virtual SurfaceInterface* NewSurface(NativeDrawTarget inTarget, NativeRegion inRegion, bool inBuffered) const = 0;
   // A surface over another surface's state, restricted to inRect when given.
   virtual SurfaceInterface* NewReferenceSurface(SurfaceInterface* inSurface, bool inFlag,
