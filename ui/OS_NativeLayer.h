@@ -28,6 +28,8 @@ class SupplierInterface;
 
 namespace norvik::ui {
 
+class KeyboardLayoutInterface;
+
 using OS_Point = tarsel::geom::PointT<long>;
 using OS_Rect = tarsel::geom::RectT<long>;
 
@@ -223,6 +225,9 @@ class OS_NativeLayer {
   // Virtual key state: bit 15 set while down, bit 0 the toggle.
   virtual short GetKeyState(int inVirtualKey) const = 0;        // as of the message being handled
   virtual short GetAsyncKeyState(int inVirtualKey) const = 0;   // now
+  // The active keyboard layout's answers to shortcut questions; null keeps the
+  // built-in US layout.
+  virtual const KeyboardLayoutInterface* GetKeyboardLayout() const { return nullptr; }
 
   // ---- monitors and preferences ----
   virtual std::vector<OS_Monitor> GetMonitors() const = 0;

@@ -1,6 +1,7 @@
 // Installing a native layer, and the focus questions answered through it.
 // Written once against OS_NativeLayer, so every port shares it.
 #include "ui/InputPlatform.h"
+#include "ui/KeyboardLayout.h"
 #include "ui/OS_FocusPlatform.h"
 #include "ui/OS_NativeLayer.h"
 #include "ui/UI_NodeManager.h"
@@ -53,6 +54,7 @@ void InstallNativeLayer(OS_NativeLayer* inLayer) {
   SetNativeLayer(inLayer);
   // With no installed answers, the input questions go to the native layer.
   SetInputPlatform(nullptr);
+  SetKeyboardLayout(inLayer ? inLayer->GetKeyboardLayout() : nullptr);
   if (UI_NodeManager* manager = UI_NodeManager::Get(true))
     manager->SetFocusPlatform(inLayer ? &GetNativeFocusPlatform() : nullptr);
 }
