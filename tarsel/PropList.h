@@ -129,6 +129,8 @@ class PropList : public utility::RefCountedObject {
   // Literals: without these a string literal would convert to bool.
   void SetValue(std::string_view inKey, const char* inValue);
   void SetValue(std::string_view inKey, const char16_t* inValue);
+  // Any other 8-bit text (std::string, std::string_view) as a UTF8String.
+  void SetValue(std::string_view inKey, std::string_view inValue);
   void SetValue(std::string_view inKey, std::vector<std::int32_t> inValue);
   void SetValue(std::string_view inKey, std::vector<std::uint32_t> inValue);
   void SetValue(std::string_view inKey, std::vector<float> inValue);

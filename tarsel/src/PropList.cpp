@@ -118,6 +118,9 @@ void PropList::SetValue(std::string_view inKey, const UTF16String& inValue) { Pu
 void PropList::SetValue(std::string_view inKey, const char* inValue) {
   Put(inKey, PropValue(UTF8String(inValue ? inValue : "")));
 }
+void PropList::SetValue(std::string_view inKey, std::string_view inValue) {
+  Put(inKey, PropValue(UTF8String(inValue.data(), inValue.size())));
+}
 void PropList::SetValue(std::string_view inKey, const char16_t* inValue) {
   Put(inKey, PropValue(UTF16String(inValue ? inValue : u"")));
 }

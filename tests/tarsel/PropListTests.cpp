@@ -65,6 +65,10 @@ TEST(PropListTests, StringLiteralsAreStoredAsTextNotAsBooleans) {
   EXPECT_EQ("1.2", narrow);
   EXPECT_EQ(u"Hello", wide);
   EXPECT_FALSE(list.GetValue("narrow", wide)) << "8-bit and UTF-16 strings are different types";
+
+  list.SetValue("std", std::string("from std::string"));
+  ASSERT_TRUE(list.GetValue("std", narrow));
+  EXPECT_EQ("from std::string", narrow);
 }
 
 TEST(PropListTests, SettingAKeyAgainReplacesItsValueAndType) {
