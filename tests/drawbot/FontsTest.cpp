@@ -203,3 +203,33 @@ TEST(MultiLineText, AnUnknownTextDisplayPolicyIsRefused) {
 
 }  // namespace
 }  // namespace norvik::drawbot
+
+namespace norvik::drawbot {
+namespace {
+
+int PartialPixels(PixelImage const& inImage, int inTop, int inBottom) {
+  int partial = 0;
+  for (int y = inTop; y < inBottom; ++y)
+    for (int x = 0; x < inImage.width; ++x) partial += inImage.Alpha(x, y) > 0 && inImage.Alpha(x, y) < 255;
+  return partial;
+}
+
+TEST(TextPlacement, ChangingTheAntiAliasPolicyBetweenStringsChangesHowTheNextOneIsDrawn) {
+  PixelCanvas canvas(80, 60);
+  SurfaceInterface* surface = canvas.GetSurface();
+  FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 14);
+  BrushP brush(canvas.GetSupplier(), ColorRGBA(0, 0, 0, 1));
+  surface->DrawString(*brush, *font, Chars(u"Render"), PointT<float>(2, 18), kTextAlignLeft, kTextTruncationNone, 0);
+  surface->PushStateStack();
+  surface->SetAntiAliasPolicy(kAntiAlias);
+  surface->DrawString(*brush, *font, Chars(u"Render"), PointT<float>(2, 48), kTextAlignLeft, kTextTruncationNone, 0);
+  surface->PopStateStack();
+  surface->DrawString(*brush, *font, Chars(u"Render"), PointT<float>(40, 18), kTextAlignLeft, kTextTruncationNone,
+                      0);
+  auto image = canvas.Snapshot();
+  EXPECT_EQ(PartialPixels(image, 0, 30), 0);
+  EXPECT_GT(PartialPixels(image, 30, 60), 10);
+}
+
+}  // namespace
+}  // namespace norvik::drawbot

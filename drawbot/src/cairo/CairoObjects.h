@@ -288,6 +288,7 @@ class OSSurfaceInterface : public SurfaceInterface {
   cairo_region_t* mRegion;
   boost::intrusive_ptr<DataDeleter> mDeleter;
   PangoLayout* mLayout = nullptr;
+  int mLayoutPolicies = -1;
   bool mCanGiveImage;
   bool mHasDrawn = false;
   std::vector<State> mStates;

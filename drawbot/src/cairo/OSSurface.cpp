@@ -203,7 +203,12 @@ PangoLayout* OSSurfaceInterface::PrepareLayout(FontInterface const& inFont) {
   auto const& font = Cast<OSFontInterface>(inFont);
   if (mLayout == nullptr) mLayout = pango_cairo_create_layout(mContext);
   pango_cairo_update_layout(mContext, mLayout);
-  ApplyTextPolicies(mLayout, mStates.back().antiAlias, mStates.back().textDisplay);
+  // Changing font options makes Pango lay out again; do it only when the policies change.
+  int policies = mStates.back().antiAlias * 4 + mStates.back().textDisplay;
+  if (policies != mLayoutPolicies) {
+    ApplyTextPolicies(mLayout, mStates.back().antiAlias, mStates.back().textDisplay);
+    mLayoutPolicies = policies;
+  }
   pango_layout_set_font_description(mLayout, font.GetDescription());
   return mLayout;
 }
