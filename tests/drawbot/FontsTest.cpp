@@ -233,3 +233,17 @@ TEST(TextPlacement, ChangingTheAntiAliasPolicyBetweenStringsChangesHowTheNextOne
 
 }  // namespace
 }  // namespace norvik::drawbot
+
+namespace norvik::drawbot {
+namespace {
+
+TEST(Fonts, ALengthPastTheEndMeasuresOnlyUpToTheTerminator) {
+  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
+  UTF16String text = u"Pan";
+  EXPECT_FLOAT_EQ(font->MeasureStringWidth(Chars(text), 50), font->MeasureStringWidth(Chars(text), -1));
+  EXPECT_EQ(font->MeasureStringWidth(Chars(text), 0), 0);
+  EXPECT_EQ(font->MeasureStringWidth(nullptr, -1), 0);
+}
+
+}  // namespace
+}  // namespace norvik::drawbot

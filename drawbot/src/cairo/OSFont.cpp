@@ -13,11 +13,9 @@ namespace norvik::drawbot::cairo {
 std::string ToUTF8(unsigned short const* inText, long inLength) {
   if (inText == nullptr) return std::string();
   auto const* chars = reinterpret_cast<char16_t const*>(inText);
+  // A length past the terminator stops at the terminator.
   size_t length = 0;
-  if (inLength < 0)
-    while (chars[length] != 0) ++length;
-  else
-    length = static_cast<size_t>(inLength);
+  while ((inLength < 0 || length < static_cast<size_t>(inLength)) && chars[length] != 0) ++length;
   return tarsel::utility::ToStdString(tarsel::utility::UTF16to8(std::u16string_view(chars, length)));
 }
 
