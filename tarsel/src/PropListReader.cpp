@@ -27,7 +27,6 @@ enum class Scalar { kInt32, kUInt32, kFloat, kDouble, kString, kUString };
 struct Frame {
   Kind kind = Kind::kMap;
   Scalar scalar = Scalar::kString;  // kScalar, kTypeName
-  std::size_t line = 0;
   PropListP list;                   // kList
   UTF8String key;                   // kPair
   bool hasKey = false;              // kPair
@@ -106,7 +105,6 @@ void PropListHandler::Push(Kind inKind, Scalar inScalar) {
   Frame frame;
   frame.kind = inKind;
   frame.scalar = inScalar;
-  frame.line = Line();
   if (inKind == Kind::kList) frame.list = PropListP(new PropList());
   mStack.push_back(std::move(frame));
 }
