@@ -17,8 +17,8 @@ class ThemeOwner {
   ThemeOwner& operator=(const ThemeOwner&) = delete;
 
   virtual void SetThemeName(const UTF16String& inName, bool inNotify);
-  // The theme of this owner's name. Until the theme registry exists there is
-  // no theme to find, and the answer is null.
+  // The theme registered under this owner's name, or the default theme when
+  // the name is not registered.
   virtual ThemeP GetTheme() const;
   virtual ~ThemeOwner();
 

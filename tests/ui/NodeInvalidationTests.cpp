@@ -95,6 +95,7 @@ TEST_F(Invalidation, ASecondInvalidationUnderTheSameSeedIsCutShort) {
   manager.IncrementDrawbotCacheSeed();
   leaf->UI_InvalidateDrawbotCache(false);
   // Without a theme, storing a cache does not move the seed on.
+  mid->UI_SetThemeSupplier(boost::make_shared<boost::function<ThemeP()>>([] { return ThemeP(); }));
   mid->UI_SetDrawbotCache(new FakeCache);
   leaf->UI_InvalidateDrawbotCache(false);
   EXPECT_NE(mid->UI_GetDrawbotCache(), nullptr);

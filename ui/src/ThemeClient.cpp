@@ -15,6 +15,50 @@ void ThemeClient::UI_SetThemeSupplier(const ThemeSupplier& inSupplier) {
   UI_ThemeUpdated(1);
 }
 
+void ThemeClient::SetCustomThemeColor(std::uint64_t inID, const drawbot::ColorRGBA& inColor) {
+  auto inserted = mCustomColors.emplace(inID, inColor);
+  if (!inserted.second) {
+    if (inserted.first->second == inColor) return;
+    inserted.first->second = inColor;
+  }
+  UI_ThemeUpdated(1);
+}
+
+void ThemeClient::ClearCustomThemeColor(std::uint64_t inID) {
+  mCustomColors.erase(inID);
+  UI_ThemeUpdated(1);
+}
+
+void ThemeClient::SetCustomFontSize(std::uint64_t inID, float inSize) {
+  auto inserted = mCustomFontSizes.emplace(inID, inSize);
+  if (!inserted.second) {
+    if (inserted.first->second == inSize) return;
+    inserted.first->second = inSize;
+  }
+  UI_ThemeUpdated(1);
+}
+
+void ThemeClient::ClearCustomFontSize(std::uint64_t inID) {
+  mCustomFontSizes.erase(inID);
+  UI_ThemeUpdated(1);
+}
+
+drawbot::ColorRGBA ThemeClient::GetThemeColor(std::uint64_t inID) const {
+  auto it = mCustomColors.find(inID);
+  if (it != mCustomColors.end()) return it->second;
+  return UI_GetCurrentTheme()->GetColor(inID);
+}
+
+UTF16String ThemeClient::GetThemeFontName(std::uint64_t inID) const {
+  return UI_GetCurrentTheme()->GetFontName(inID);
+}
+
+float ThemeClient::GetThemeFontSize(std::uint64_t inID) const {
+  auto it = mCustomFontSizes.find(inID);
+  if (it != mCustomFontSizes.end()) return it->second;
+  return UI_GetCurrentTheme()->GetFontSize(inID);
+}
+
 void ThemeClient::UI_ResetThemeSupplier() {
   mThemeSupplier.reset();
   if (!mDefaultThemeSupplier) {
@@ -36,6 +80,6 @@ ThemeP ThemeClient::UI_GetCurrentTheme() const {
 
 void ThemeClient::UI_ThemeUpdated(unsigned long) {}
 
-ThemeP ThemeClient::UI_DefaultThemeSupplier() const { return ThemeP(); }
+ThemeP ThemeClient::UI_DefaultThemeSupplier() const { return Theme::GetTheme(GetDefaultThemeName()); }
 
 }  // namespace norvik::ui

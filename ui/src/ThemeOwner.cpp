@@ -5,7 +5,8 @@
 namespace norvik::ui {
 
 ThemeOwner::ThemeOwner()
-    : mSharedSupplier(boost::make_shared<boost::function<ThemeP()>>([this] { return GetTheme(); })) {}
+    : mThemeName(GetDefaultThemeName()),
+      mSharedSupplier(boost::make_shared<boost::function<ThemeP()>>([this] { return GetTheme(); })) {}
 
 ThemeOwner::~ThemeOwner() {
   // Clients may still hold the shared supplier; after this owner is gone it
@@ -18,6 +19,9 @@ void ThemeOwner::SetThemeName(const UTF16String& inName, bool) {
   mThemeNameSet = true;
 }
 
-ThemeP ThemeOwner::GetTheme() const { return ThemeP(); }
+ThemeP ThemeOwner::GetTheme() const {
+  ThemeP theme = Theme::GetTheme(mThemeName);
+  return theme ? theme : Theme::GetTheme(GetDefaultThemeName());
+}
 
 }  // namespace norvik::ui

@@ -114,7 +114,9 @@ void UI_Node::UI_SetDrawbotCache(const boost::intrusive_ptr<drawbot::CacheInterf
   mCacheTheme = (*supplier)();
   if (!mCacheTheme) return;
   mCacheThemeChangeCount = mCacheTheme->GetThemeChangeCount();
-  // A stored cache re-arms invalidation everywhere.
+  // A stored cache re-arms invalidation everywhere. Dropping one does not:
+  // invalidation drops caches on its way up, and must not re-arm itself.
+  if (!inCache) return;
   if (UI_NodeManager* manager = UI_NodeManager::Get()) manager->IncrementDrawbotCacheSeed();
 }
 
