@@ -31,6 +31,7 @@
 #include "ui/UI_NodeBase.h"
 
 namespace norvik::drawbot {
+struct ColorRGBA;
 class CacheInterface;
 class Drawbot;
 class SupplierInterface;
@@ -357,6 +358,29 @@ class UI_Node : public UI_NodeBase {
   DrawCachePolicy UI_GetDrawCachePolicy() const { return mDrawCachePolicy; }
   void UI_SetClipToSelfEnabled(bool inClip) { mClipToSelf = inClip; }
   bool UI_GetClipToSelfEnabled() const { return mClipToSelf; }
+
+  // ---- draw traversal ----
+  // Each child in child order, so later children paint over earlier ones.
+  void UI_DispatchDrawToChildren(drawbot::Drawbot* inDrawbot);
+  // One child in its own coordinates. Native windows, hidden children,
+  // children scaled to nothing and children outside the clip are skipped
+  // before any work on their subtree.
+  void UI_DispatchDrawToChild(UI_Node* inChild, drawbot::Drawbot* inDrawbot);
+  // Draws through the node's cache when its policy caches, rebuilding a stale one.
+  void UI_DrawAndCache(drawbot::Drawbot* inDrawbot, bool inFromRoot, const drawbot::ColorRGBA* inBackground);
+  // From a root: background, then the children (the root's own UI_Draw is not
+  // called). Otherwise the custom draw function or UI_Draw.
+  void UI_DrawSelf(drawbot::Drawbot* inDrawbot, bool inFromRoot, const drawbot::ColorRGBA* inBackground);
+  // The custom draw function when it answers true, else UI_Draw.
+  void UI_DispatchDraw(drawbot::Drawbot* inDrawbot);
+  // The entry of a native paint. With inUseBuffer the tree draws into a
+  // buffered reference surface, flushed at the end.
+  void UI_DispatchDrawFromRoot(const drawbot::ColorRGBA* inBackground, drawbot::Drawbot* inDrawbot,
+                               bool inUseBuffer);
+  // Cuts the rectangles of hosted native controls out of the clip (even-odd),
+  // so that drawing never paints over them.
+  void UI_ClipOSControls(drawbot::Drawbot* inDrawbot);
+  static void UI_ClipToRect(const RectF& inRect, drawbot::Drawbot* inDrawbot);
 
   // Theme supplier of a node: the nearest active theme owner up the tree.
   ThemeP UI_DefaultThemeSupplier() const override;

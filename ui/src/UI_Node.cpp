@@ -169,15 +169,6 @@ bool UI_Node::UI_AreAllParentsVisible() const {
   return parent && parent->UI_AreAllParentsVisible();
 }
 
-// The draw traversal is added with the drawing of nodes; until then a node draws nothing.
-void UI_Node::UI_Draw(drawbot::Drawbot*) {}
-
-bool UI_Node::UI_UseDrawbotCache(drawbot::Drawbot*) const {
-  // kDrawCacheDefault asks the drawing supplier, which is not reachable from
-  // here yet; it is treated as "do not cache".
-  return mDrawCachePolicy == kDrawCacheAlways;
-}
-
 void UI_Node::UI_GetDrawSegments(std::vector<RectL>&) const {}
 
 drawbot::SupplierInterface* UI_Node::UI_GetDrawSupplier() const {

@@ -1,0 +1,185 @@
+// The draw traversal: from a drawing root through the children, each node
+// drawn directly or through its cached rendering.
+#include <cmath>
+#include <optional>
+#include <vector>
+
+#include "drawbot/CacheInterface.h"
+#include "drawbot/Drawbot.h"
+#include "drawbot/SupplierInterface.h"
+#include "drawbot/SurfaceInterface.h"
+#include "ui/UI_Node.h"
+
+namespace norvik::ui {
+
+namespace {
+
+// Scales at or below this are treated as zero: such a child covers nothing.
+constexpr float kMinimumScale = 1e-6f;
+
+// The theme a node's supplier answers and its change count at one moment,
+// so that a change in the middle of a drawing can be noticed.
+struct ThemeStamp {
+  ThemeP theme;
+  std::uint64_t count = 0;
+
+  bool operator==(const ThemeStamp& o) const { return theme == o.theme && count == o.count; }
+  bool operator!=(const ThemeStamp& o) const { return !(*this == o); }
+};
+
+ThemeStamp CurrentThemeStamp(const UI_Node& inNode) {
+  ThemeStamp stamp;
+  const ThemeSupplier& supplier = inNode.UI_GetThemeSupplier();
+  if (supplier && !supplier->empty()) stamp.theme = (*supplier)();
+  if (stamp.theme) stamp.count = stamp.theme->GetThemeChangeCount();
+  return stamp;
+}
+
+}  // namespace
+
+void UI_Node::UI_Draw(drawbot::Drawbot* inDrawbot) { UI_DispatchDrawToChildren(inDrawbot); }
+
+bool UI_Node::UI_UseDrawbotCache(drawbot::Drawbot* inDrawbot) const {
+  switch (mDrawCachePolicy) {
+    case kDrawCacheAlways:
+      return true;
+    case kDrawCacheNever:
+      return false;
+    case kDrawCacheDefault:
+      break;
+  }
+  const drawbot::SupplierInterface* supplier = inDrawbot ? inDrawbot->GetSupplier() : nullptr;
+  return supplier && supplier->PrefersToCacheAggressively();
+}
+
+void UI_Node::UI_DispatchDrawToChildren(drawbot::Drawbot* inDrawbot) {
+  UI_NodeProtector protector(this);
+  // A copy with strong references: a child's drawing may remove siblings.
+  const std::vector<UI_NodeP> children(mChildren.begin(), mChildren.end());
+  for (const UI_NodeP& child : children) {
+    if (child->UI_GetParentContainer() != this) continue;
+    UI_DispatchDrawToChild(child.get(), inDrawbot);
+  }
+}
+
+void UI_Node::UI_DispatchDrawToChild(UI_Node* inChild, drawbot::Drawbot* inDrawbot) {
+  if (!inChild || !inDrawbot || !inDrawbot->GetSurface()) return;
+  if (inChild->UI_ReceivesEventsFromOS()) return;  // a native window paints itself
+  if (!inChild->UI_IsShown()) return;
+  const Matrix matrix = inChild->UI_GetSelfToParentMatrix();
+  if (!(std::fabs(matrix.sx) > kMinimumScale) || !(std::fabs(matrix.sy) > kMinimumScale)) return;
+
+  UI_NodeP protector(inChild);
+  drawbot::SurfaceInterfaceP surface(inDrawbot->GetSurface());
+  drawbot::ScSurfaceState state(surface.get());
+  surface->Transform(tarsel::geom::MatrixT<float>(matrix));
+  if (surface->IsWithinClipBounds(UI_EnclosingRect(inChild->UI_GetLocalRectF(false))))
+    inChild->UI_DrawAndCache(inDrawbot, false, nullptr);
+}
+
+void UI_Node::UI_DrawAndCache(drawbot::Drawbot* inDrawbot, bool inFromRoot,
+                              const drawbot::ColorRGBA* inBackground) {
+  UI_NodeProtector protector(this);
+  drawbot::SurfaceInterface* surface = inDrawbot->GetSurface();
+  const RectF rect = UI_GetLocalRectF(false);
+
+  if (UI_UseDrawbotCache(inDrawbot)) {
+    if (!mDrawbotCache || !UI_IsDrawbotCacheValid(*surface)) {
+      if (mDrawbotCache) UI_InvalidateDrawbotCache(false);
+      const ThemeStamp before = CurrentThemeStamp(*this);
+      drawbot::CacheInterfaceP cache = surface->PushCacheStack(rect);
+      if (cache) {
+        drawbot::SurfaceInterface* cacheSurface = cache->GetSurface() ? cache->GetSurface() : surface;
+        drawbot::Drawbot cacheDrawbot(inDrawbot->GetSupplier(), cacheSurface);
+        UI_DrawSelf(&cacheDrawbot, inFromRoot, inBackground);
+        if (cacheSurface != surface) cacheSurface->Flush();
+        // Pixels drawn across a theme change mix two themes: they are not kept,
+        // and the node is drawn again below in the new colours.
+        if (CurrentThemeStamp(*this) == before) UI_SetDrawbotCache(cache);
+        surface->PopCacheStack(cache);
+      }
+    }
+  } else {
+    // A node that does not cache must still drop what it had.
+    UI_InvalidateDrawbotCache(false);
+  }
+
+  if (mDrawbotCache)
+    surface->DrawCache(*mDrawbotCache);
+  else
+    UI_DrawSelf(inDrawbot, inFromRoot, inBackground);
+}
+
+void UI_Node::UI_DrawSelf(drawbot::Drawbot* inDrawbot, bool inFromRoot, const drawbot::ColorRGBA* inBackground) {
+  drawbot::SurfaceInterface* surface = inDrawbot->GetSurface();
+  const RectF local = UI_GetLocalRectF(false);
+  std::optional<drawbot::ScSurfaceState> clipState;
+  if (mClipToSelf) {
+    clipState.emplace(surface);
+    UI_ClipToRect(local, inDrawbot);
+  }
+  if (inFromRoot) {
+    if (inBackground && inBackground->alpha > 0) {
+      surface->SetAntiAliasPolicy(drawbot::kAntiAlias);
+      surface->PaintRect(*inBackground, local);
+    }
+    UI_DispatchDrawToChildren(inDrawbot);
+    return;
+  }
+  UI_DispatchDraw(inDrawbot);
+}
+
+void UI_Node::UI_DispatchDraw(drawbot::Drawbot* inDrawbot) {
+  UI_NodeProtector protector(this);
+  // A copy, so that the function may replace itself while it runs.
+  const CustomDrawFunction custom = mCustomDraw;
+  if (custom && !custom->empty() && (*custom)(this, inDrawbot)) return;
+  UI_Draw(inDrawbot);
+}
+
+void UI_Node::UI_DispatchDrawFromRoot(const drawbot::ColorRGBA* inBackground, drawbot::Drawbot* inDrawbot,
+                                      bool inUseBuffer) {
+  if (!inDrawbot || !inDrawbot->GetSurface() || !UI_IsShown()) return;
+  UI_NodeProtector protector(this);
+  UI_ClipOSControls(inDrawbot);
+  if (!inDrawbot->GetSurface()->IsWithinClipBounds(UI_EnclosingRect(UI_GetLocalRectF(false)))) return;
+
+  const drawbot::SupplierInterface* supplier = inDrawbot->GetSupplier();
+  if (inUseBuffer && supplier) {
+    drawbot::SurfaceInterfaceP buffered(supplier->NewReferenceSurface(inDrawbot->GetSurface(), true, nullptr));
+    if (buffered) {
+      drawbot::Drawbot bufferedDrawbot(supplier, buffered.get());
+      UI_DrawAndCache(&bufferedDrawbot, true, inBackground);
+      buffered->Flush();
+      return;
+    }
+  }
+  UI_DrawAndCache(inDrawbot, true, inBackground);
+}
+
+void UI_Node::UI_ClipOSControls(drawbot::Drawbot* inDrawbot) {
+  OSControlClipRects rects;
+  UI_GetOSControlClipRects(rects);
+  if (rects.empty()) return;
+  drawbot::SurfaceInterface* output = inDrawbot->GetSurface()->GetOutputSurface();
+  const drawbot::SupplierInterface* supplier = inDrawbot->GetSurface()->GetOutputSupplier();
+  if (!output || !supplier) return;
+
+  boost::intrusive_ptr<drawbot::PathInterface> path(supplier->NewPath());
+  path->AddRect(UI_GetLocalRectF(false));
+  for (const auto& entry : rects) {
+    const RectF global = entry.first ? entry.first->UI_LocalToGlobalF(entry.second) : entry.second;
+    path->AddRect(UI_GlobalToLocalF(global));
+  }
+  // Even-odd: each control's rectangle inside the node's is a hole.
+  output->Clip(*path, drawbot::kFillAlternate);
+}
+
+void UI_Node::UI_ClipToRect(const RectF& inRect, drawbot::Drawbot* inDrawbot) {
+  drawbot::SurfaceInterface* surface = inDrawbot->GetSurface();
+  boost::intrusive_ptr<drawbot::PathInterface> path(inDrawbot->GetSupplier()->NewPath());
+  path->AddRect(inRect);
+  surface->Clip(*path, drawbot::kFillWinding);
+}
+
+}  // namespace norvik::ui
