@@ -25,6 +25,7 @@
 
 #include "tarsel/Flags.h"
 #include "tarsel/PointT.h"
+#include "tarsel/Threads.h"
 #include "ui/CustomSettingsManager.h"
 #include "ui/DrawbotImageResourceCache.h"
 #include "ui/InputCapture.h"
@@ -106,6 +107,10 @@ class UI_NodeManager : private boost::noncopyable {
   bool IsMnemonicEnabled() const { return mMnemonicsEnabled; }
   tarsel::utility::Flags<unsigned char> GetLastModKeys() const { return mLastModKeys; }
   void SetLastModKeys(tarsel::utility::Flags<unsigned char> inKeys) { mLastModKeys = inKeys; }
+
+  // The executor of the main thread, which registered itself when this
+  // manager was made; other threads post work to the UI through it.
+  tarsel::threads::AsyncEventLoopAdaptorPtr GetExecutor() const { return mExecutor; }
 
   // ---- seams ----
   void SetToolTipManager(std::unique_ptr<UI_ToolTipManager> inManager);
@@ -331,6 +336,7 @@ class UI_NodeManager : private boost::noncopyable {
   std::vector<BoolFunction> mTextEditFocusFunctions;
   std::vector<UserResizeFunction> mUserResizeFunctions;
   tarsel::utility::Flags<unsigned char> mLastModKeys;
+  tarsel::threads::AsyncEventLoopAdaptorPtr mExecutor;
   bool mMnemonicsEnabled = false;
   bool mBlockDialogsFromStealingHotTextEditTextKeys = false;
   std::uint64_t mDrawbotCacheSeed = 0;

@@ -22,6 +22,9 @@ TEST(NodeManagerLifetime, TheInstanceIsReachableOnlyWhileItLives) {
     EXPECT_TRUE(manager.IsApplicationFrontmost());
     EXPECT_FALSE(manager.IsMnemonicEnabled());
     EXPECT_EQ(manager.GetDrawbotCacheSeed(), 0u);
+    ASSERT_NE(manager.GetExecutor(), nullptr);
+    EXPECT_EQ(manager.GetExecutor(), tarsel::threads::GetMainThreadExecutor());
+    EXPECT_TRUE(tarsel::threads::IsMainThread());
   }
   EXPECT_EQ(UI_NodeManager::Get(), nullptr);
 }

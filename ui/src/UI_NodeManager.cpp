@@ -13,7 +13,9 @@ namespace {
 UI_NodeManager* gManager = nullptr;
 }
 
-UI_NodeManager::UI_NodeManager() : mCustomSettingsManager(std::make_unique<CustomSettingsManager>()) {
+UI_NodeManager::UI_NodeManager()
+    : mCustomSettingsManager(std::make_unique<CustomSettingsManager>()),
+      mExecutor(tarsel::threads::RegisterCurrentThreadAsMainThread()) {
   gManager = this;
 }
 
