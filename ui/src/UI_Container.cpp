@@ -33,6 +33,7 @@ UI_Container::iterator UI_Container::ChildFind(const UI_Node* inChild) {
 void UI_Container::ChildPushBack(const UI_NodeP& inChild) {
   if (!inChild) return;
   int index = boost::numeric_cast<int>(mChildren.size());
+  UI_NodeProtector protect(GetAsANode());
   UI_NodeP child(inChild);
   child->UI_SetParent(this);
   child->mIndex = index;
@@ -47,6 +48,7 @@ UI_Container::iterator UI_Container::ChildInsert(iterator inWhere, const UI_Node
 UI_Container::iterator UI_Container::ChildInsert(std::size_t inIndex, const UI_NodeP& inChild) {
   std::size_t at = static_cast<std::size_t>(CheckedIndex(inIndex, mChildren.size() + 1));
   if (!inChild) return mChildren.begin() + static_cast<std::ptrdiff_t>(at);
+  UI_NodeProtector protect(GetAsANode());
   UI_NodeP child(inChild);
   mChildren.push_back(child);
   std::rotate(mChildren.begin() + static_cast<std::ptrdiff_t>(at), mChildren.end() - 1, mChildren.end());
@@ -62,6 +64,7 @@ UI_Container::iterator UI_Container::ChildInsert(std::size_t inIndex, const UI_N
 
 UI_NodeP UI_Container::ChildRemove(iterator inWhere) {
   if (inWhere == mChildren.end()) return UI_NodeP();
+  UI_NodeProtector protect(GetAsANode());
   UI_NodeP child = *inWhere;
   iterator next = mChildren.erase(inWhere);
   UpdateIndicesToEnd(next);
@@ -75,6 +78,8 @@ UI_NodeP UI_Container::ChildRemove(iterator inWhere) {
 UI_NodeP UI_Container::ChildRemove(UI_Node* inChild) {
   iterator where = ChildFind(inChild);
   if (where == mChildren.end()) return UI_NodeP();
+  // Focus hand-over runs host code, which may drop the last reference to this node.
+  UI_NodeProtector protect(GetAsANode());
   UI_NodeP child = *where;
   if (UI_NodeManager* manager = UI_NodeManager::Get()) {
     manager->ReplaceInAllCachedNodes(child.get(), GetAsANode(), true);
@@ -126,6 +131,7 @@ void UI_Container::DetachChild(UI_Node* inChild) {
 
 void UI_Container::DeleteChildren() {
   // Work on our own copy: the callbacks below may add or remove children.
+  UI_NodeProtector protect(GetAsANode());
   ChildList children;
   children.swap(mChildren);
   mTabOrderCache.clear();
