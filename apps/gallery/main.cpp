@@ -1,18 +1,83 @@
-// The gallery: shows what the toolkit can do. Until native windows exist it
-// reports the library it was built against and the services it checked.
+// The gallery: the toolkit's own program, one window whose page shows what
+// the toolkit can do. With --screenshot, or where no display opens, it
+// renders the page through the headless window system to a PNG and exits.
 #include <cstdio>
+#include <exception>
+#include <string>
+#include <vector>
 
-#include "tarsel/Localizer.h"
-#include "tarsel/MatrixT.h"
-#include "tarsel/UTFString.h"
+#include "GalleryOptions.h"
+#include "GalleryPage.h"
+#include "GalleryWindow.h"
+#include "tarsel/ThrowError.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/KeyframeThemeEditor.h"
+#include "ui/OS_NodeManager.h"
+#include "ui/Theme.h"
 
-int main() {
-  using namespace tarsel;
-  UTF16String title = config::Localize("$$$/norvik/gallery/Title=norvik gallery");
-  geom::MatrixF m = geom::MatrixF::Scale(2, 2);
-  bool invertible = m.Invert(false);
-  std::printf("%s\n", utility::ToStdString(utility::UTF16to8(title)).c_str());
-  std::printf("core services loaded; matrix inversion %s\n", invertible ? "works" : "FAILED");
-  std::printf("native windows are not built yet: the gallery has no window to show.\n");
-  return invertible ? 0 : 1;
+namespace {
+
+using namespace norvik;
+
+std::string Say(std::string_view inKey, const std::string& inValue = std::string()) {
+  std::string text = tarsel::utility::ToStdString(tarsel::utility::UTF16to8(gallery::Text(inKey)));
+  const std::size_t at = text.find("^0");
+  if (at != std::string::npos) text.replace(at, 2, inValue);
+  return text;
+}
+
+// Renders the page in a headless window and writes the window's pixels.
+int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEditorP inTheme, const std::string& inPath) {
+  ui::HeadlessWindowSystem system;
+  system.Install();
+  int result = gallery::kExitOK;
+  {
+    gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
+    gallery::GalleryWindow window(system.GetLayer(), page, inOptions.width, inOptions.height);
+    system.Pump();
+    window.Update();
+    if (!system.WriteWindowPNG(window.GetHandle(), inPath)) {
+      std::fprintf(stderr, "%s\n", Say("$$$/norvik/gallery/Error/WritePNG=Could not write the image ^0.", inPath).c_str());
+      result = gallery::kExitFailure;
+    } else {
+      std::printf("%s\n", Say("$$$/norvik/gallery/Wrote=Wrote ^0.", inPath).c_str());
+    }
+  }
+  system.Uninstall();
+  return result;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  gallery::GalleryOptions options;
+  std::string error;
+  if (!gallery::ParseGalleryOptions(std::vector<std::string>(argv + 1, argv + argc), options, error)) {
+    std::fprintf(stderr, "norvik-gallery: %s\n", error.c_str());
+    return gallery::kExitUsage;
+  }
+  if (options.help) {
+    std::printf("%s", gallery::GalleryUsage().c_str());
+    return gallery::kExitOK;
+  }
+  try {
+    ui::OS_NodeManager manager;
+    ui::KeyframeThemeEditorP theme = ui::MakeDefaultKeyframeTheme();
+    ui::Theme::Initialize(theme);
+    std::string path = options.screenshot;
+    if (path.empty()) {
+      path = "norvik-gallery.png";
+      std::printf("%s\n", Say("$$$/norvik/gallery/NoDisplay=No display to show a window on: rendering to ^0 instead.",
+                              path)
+                              .c_str());
+    }
+    const int result = RenderToPNG(options, theme, path);
+    ui::Theme::Terminate();
+    return result;
+  } catch (const tarsel::config::Exception& e) {
+    std::fprintf(stderr, "norvik-gallery: %s\n", e.what());
+  } catch (const std::exception& e) {
+    std::fprintf(stderr, "norvik-gallery: %s\n", e.what());
+  }
+  return gallery::kExitFailure;
 }

@@ -1,0 +1,26 @@
+#pragma once
+// The gallery's command line.
+#include <string>
+#include <vector>
+
+namespace norvik::gallery {
+
+struct GalleryOptions {
+  std::string screenshot;  // write this PNG and exit; empty: show a window when a display opens
+  bool light = false;
+  long width = 1120;
+  long height = 720;
+  bool help = false;
+};
+
+// Exit codes of the program.
+enum GalleryExitCode { kExitOK = 0, kExitFailure = 1, kExitUsage = 2 };
+
+// Reads the arguments after the program name. On a bad argument, answers
+// false with a message naming it in outError.
+bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions& outOptions, std::string& outError);
+
+// The text --help prints.
+std::string GalleryUsage();
+
+}  // namespace norvik::gallery

@@ -1,0 +1,105 @@
+#include "GalleryPage.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace norvik::gallery {
+
+namespace {
+
+const char* const kSectionIDs[] = {"section-colours", "section-drawing", "section-tree", "section-focus"};
+
+}  // namespace
+
+GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mTheme(std::move(inTheme)), mLight(inLight) {
+  UI_SetNodeID("gallery-page");
+  mTheme->SetBrightness(mLight ? 1.0f : 0.0f);
+  mTheme->NotifyThemeChanged();
+
+  mHeader.reset(new HeaderView());
+  mHeader->UI_Show(true);
+  ChildPushBack(mHeader);
+  mSwitch.reset(new BrightnessSwitch());
+  mSwitch->SetLight(mLight);
+  mSwitch->SetChangeFunction([this](bool inLight) { SetLight(inLight); });
+  mSwitch->UI_Show(true);
+  ChildPushBack(mSwitch);
+
+  const char* const titles[] = {"$$$/norvik/gallery/Section/Colours=Theme colours",
+                                "$$$/norvik/gallery/Section/Drawing=Drawing",
+                                "$$$/norvik/gallery/Section/Tree=Node tree and hover",
+                                "$$$/norvik/gallery/Section/Focus=Keyboard focus"};
+  mContents = {ui::UI_NodeP(new SwatchView()), ui::UI_NodeP(new DrawingSamplesView()),
+               ui::UI_NodeP(new NodeTreeView()), ui::UI_NodeP(new FocusDemoView())};
+  mFocusDemo = mContents[3];
+  for (std::size_t i = 0; i < mContents.size(); ++i) {
+    boost::intrusive_ptr<SectionView> section(new SectionView(titles[i]));
+    section->UI_SetNodeID(kSectionIDs[i]);
+    section->UI_Show(true);
+    ChildPushBack(section);
+    mContents[i]->UI_Show(true);
+    section->ChildPushBack(mContents[i]);
+    mSections.push_back(section);
+  }
+}
+
+void GalleryPage::SetLight(bool inLight) {
+  mLight = inLight;
+  mSwitch->SetLight(inLight);
+  mTheme->SetBrightness(inLight ? 1.0f : 0.0f);
+  mTheme->NotifyThemeChanged();
+  UI_Invalidate(nullptr, 0);
+}
+
+void GalleryPage::Paint(drawbot::Drawbot* inDrawbot) {
+  const ColorRGBA background = CurrentColors().background;
+  UI_DispatchDrawFromRoot(&background, inDrawbot, false);
+}
+
+SectionView* GalleryPage::GetSection(const char* inID) {
+  for (auto& s : mSections)
+    if (s->UI_GetNodeID() == inID) return s.get();
+  return nullptr;
+}
+
+std::vector<ui::UI_Node*> GalleryPage::GetFocusTiles() const {
+  std::vector<ui::UI_Node*> tiles;
+  for (auto it = mFocusDemo->ChildBegin(); it != mFocusDemo->ChildEnd(); ++it) tiles.push_back(it->get());
+  return tiles;
+}
+
+void GalleryPage::UI_Invalidate(const ui::UI_Node::RectL* inRect, unsigned long inFlags) {
+  UI_SubView::UI_Invalidate(inRect, inFlags);
+  if (mInvalidate && !UI_GetParentNode()) mInvalidate(inRect);
+}
+
+void GalleryPage::UI_SizeChanged(const RectF& inLocalRect) {
+  UI_SubView::UI_SizeChanged(inLocalRect);
+  Arrange();
+}
+
+void GalleryPage::Arrange() {
+  const RectF r = UI_GetLocalRectF(false);
+  mHeader->UI_SetLocalRectF(RectF(0, 0, r.width, kHeaderHeight));
+  mSwitch->UI_SetLocalRectF(RectF(std::max(0.0f, r.width - kMargin - 140), (kHeaderHeight - 28) / 2, 140, 28));
+  const float gap = 12;
+  const float top = kHeaderHeight + kMargin;
+  const float w = std::max(0.0f, (r.width - 2 * kMargin - gap) / 2);
+  const float h = std::max(0.0f, (r.height - top - kMargin - gap) / 2);
+  for (std::size_t i = 0; i < mSections.size(); ++i) {
+    const float x = kMargin + static_cast<float>(i % 2) * (w + gap);
+    const float y = top + static_cast<float>(i / 2) * (h + gap);
+    mSections[i]->UI_SetLocalRectF(RectF(std::floor(x), std::floor(y), std::floor(w), std::floor(h)));
+    mContents[i]->UI_SetLocalRectF(mSections[i]->ContentRect());
+  }
+}
+
+void GalleryPage::UI_Draw(drawbot::Drawbot* inDrawbot) {
+  // Called only when the page is nested in another tree; as the root of the
+  // traversal, Paint's background stands for it.
+  const GalleryColors c = CurrentColors();
+  FillRect(inDrawbot, UI_GetLocalRectF(false), c.background);
+  UI_SubView::UI_Draw(inDrawbot);
+}
+
+}  // namespace norvik::gallery
