@@ -1,0 +1,67 @@
+#include "controls/UI_TextControlBase.h"
+
+#include "controls/UI_ControlView.h"
+#include "drawbot/Drawbot.h"
+#include "drawbot/DrawbotWrappers.h"
+#include "ui/UI_NodeManager.h"
+
+namespace norvik::controls {
+
+namespace {
+// Label colours: the theme's text colour, and its dimmed form when disabled.
+constexpr std::uint64_t kLabelColor = 1;
+constexpr std::uint64_t kDisabledLabelColor = 7;
+
+const unsigned short* Chars(const UTF16String& inText) {
+  return reinterpret_cast<const unsigned short*>(inText.c_str());
+}
+}  // namespace
+
+void UI_TextControlBase::FillTextParameters(DrawTextControlBaseParameters& ioParams, const ui::Theme* inTheme) const {
+  ioParams.SetText(mText);
+  if (inTheme) {
+    ioParams.SetFontName(inTheme->GetFontName(mFontSizeId));
+    ioParams.SetFontSize(inTheme->GetFontSize(mFontSizeId));
+  }
+  ioParams.SetTextAlignment(mAlignment);
+  ioParams.SetTextTruncation(mTruncation);
+}
+
+void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseParameters& inText,
+                      const tarsel::geom::RectT<float>& inRect, drawbot::Drawbot& inDrawbot) {
+  const UTF16String& text = inText.GetText();
+  const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
+  drawbot::SurfaceInterface* surface = inDrawbot.GetSurface();
+  if (text.empty() || !supplier || !surface || inRect.width <= 0 || !supplier->SupportsFonts()) return;
+  drawbot::FontP font(supplier, inText.GetFontName(), inText.GetFontStyleName(), inText.GetFontSize());
+  const bool disabled = inParams.GetControlState().Test(UI_ControlView::kStateDisabled);
+  drawbot::BrushP brush(supplier, inParams.Color(disabled ? kDisabledLabelColor : kLabelColor));
+  if (!font || !brush) return;
+  const float ascent = font->GetAscent(), descent = font->GetDescent();
+  const float baseline = inRect.top + (inRect.height - (ascent + descent)) / 2 + ascent;
+  float x = inRect.left;
+  if (inText.GetTextAlignment() == drawbot::kTextAlignCenter) x += inRect.width / 2;
+  if (inText.GetTextAlignment() == drawbot::kTextAlignRight) x += inRect.width;
+  const tarsel::geom::PointT<float> at(x, std::round(baseline));
+  const std::int64_t mnemonic = inParams.GetMnemonicLocation();
+  if (inParams.GetAllowMnemonics() && inParams.GetDisplayMnemonics() && mnemonic >= 0 &&
+      static_cast<std::size_t>(mnemonic) < text.size()) {
+    drawbot::PenP pen(supplier, inParams.Color(disabled ? kDisabledLabelColor : kLabelColor), 1);
+    surface->DrawStringWithUnderline(*brush, *font, *pen, Chars(text), at, inText.GetTextAlignment(),
+                                     inText.GetTextTruncation(), inRect.width, static_cast<long>(mnemonic),
+                                     static_cast<long>(mnemonic));
+  } else {
+    surface->DrawString(*brush, *font, Chars(text), at, inText.GetTextAlignment(), inText.GetTextTruncation(),
+                        inRect.width);
+  }
+}
+
+float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF16String& inLabel) {
+  const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
+  const drawbot::SupplierInterface* supplier = manager ? manager->GetOSDrawSupplier() : nullptr;
+  if (!supplier || inLabel.empty()) return 0;
+  drawbot::FontP font(supplier, inText.GetFontName(), inText.GetFontStyleName(), inText.GetFontSize());
+  return font ? font->MeasureStringWidth(Chars(inLabel), static_cast<long>(inLabel.size())) : 0;
+}
+
+}  // namespace norvik::controls
