@@ -129,8 +129,9 @@ bool UI_Node::UI_AdvanceFocus(bool inForward, int inIndex, UI_Container* inParen
   NRK_CONTRACT(parent_containerP);
   FocusAdvanceWalk walk(inForward ? 1 : -1);
   const UI_NodeP parentNode(parent_containerP->GetAsANode());
-  if (parentNode) {
-    for (const UI_Node* ancestor : parentNode->UI_GetNodeParents()) walk.MarkVisited(ancestor);
+  // The container and all its ancestors are never offered focus by the walk.
+  for (const UI_Node* ancestor = parentNode.get(); ancestor; ancestor = ancestor->UI_GetParentNode()) {
+    walk.MarkVisited(ancestor);
   }
   const AdvanceResult result = walk.Advance(inIndex, parent_containerP, 0);
   if (result != AdvanceResult::kFound) return false;
