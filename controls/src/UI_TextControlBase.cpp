@@ -1,5 +1,7 @@
 #include "controls/UI_TextControlBase.h"
 
+#include <cmath>
+
 #include "controls/UI_ControlView.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"

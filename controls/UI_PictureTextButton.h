@@ -1,0 +1,36 @@
+#pragma once
+// A text button with a picture beside its label. The picture is a face drawn
+// by the virtual DrawPicture, so derived buttons (the disclosure triangle)
+// can draw theirs as geometry.
+#include "controls/UI_TextButton.h"
+
+namespace norvik::controls {
+
+class UI_PictureTextButton : public UI_TextButton {
+ public:
+  explicit UI_PictureTextButton(const UTF16String& inText = UTF16String());
+
+  void SetSpacingBetweenPictureAndText(float inSpacing);
+  void SetPictureVerticalOffset(float inOffset);
+  void SetScale(float inScale);
+  float GetScale() const { return mScale; }
+  void SetImageBaseName(const UTF8String& inName) { mImageBaseName = inName; }
+  const UTF8String& GetImageBaseName() const { return mImageBaseName; }
+  void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+
+  // The picture's side, and the picture and label rectangles of inRect.
+  float GetPictureSize() const { return 12 * mScale; }
+  std::pair<RectF, RectF> ComputeTextAndImageOffset(const RectF& inRect) const;
+
+ protected:
+  // Draws the picture into inRect; the base draws nothing without an image.
+  virtual void DrawPicture(const DrawParameters& inParams, const RectF& inRect, drawbot::Drawbot& inDrawbot);
+
+ private:
+  UTF8String mImageBaseName;
+  float mSpacing = 4;
+  float mVerticalOffset = 0;
+  float mScale = 1;
+};
+
+}  // namespace norvik::controls
