@@ -1,0 +1,139 @@
+#include "x11/X11Fixture.h"
+
+#include <cairo.h>
+#include <unistd.h>
+#include <xcb/xtest.h>
+
+#include <chrono>
+#include <cstdlib>
+
+#include "support/ui/XvfbServer.h"
+#include "ui/NativeLayerFactory.h"
+
+namespace norvik::test {
+namespace {
+X11Fixture* gCurrent = nullptr;
+}
+
+void X11Fixture::SetUp() {
+  XvfbServer* server = XvfbServer::Get();
+  if (!server) GTEST_SKIP() << "Xvfb is not available";
+  mLayer = ui::CreateX11NativeLayer(server->GetDisplayName().c_str());
+  ASSERT_TRUE(mLayer) << "cannot open " << server->GetDisplayName();
+  gCurrent = this;
+  mLayer->SetWindowProcedure(&Procedure);
+  mUser = xcb_connect(server->GetDisplayName().c_str(), nullptr);
+  ASSERT_FALSE(xcb_connection_has_error(mUser));
+}
+
+void X11Fixture::TearDown() {
+  // Windows are destroyed with the layer; their last messages go nowhere.
+  gCurrent = nullptr;
+  mLayer.reset();
+  if (mUser) xcb_disconnect(mUser);
+}
+
+std::intptr_t X11Fixture::Procedure(ui::OS_WindowHandle inWindow, unsigned inMessage, std::uintptr_t inWParam,
+                                    std::intptr_t inLParam) {
+  X11Fixture* self = gCurrent;
+  if (!self) return 0;
+  RecordedMessage record{inWindow, inMessage, inWParam, inLParam};
+  self->mMessages.push_back(record);
+  if (self->mHandler && self->mHandler(record)) return 0;
+  if (inMessage == ui::kOSMsgPaint) {
+    ui::OS_PaintContext context = self->mLayer->BeginPaint(inWindow);
+    if (context.target) {
+      cairo_t* cr = cairo_create(static_cast<cairo_surface_t*>(context.target));
+      const std::uint32_t color = self->mColors[inWindow];
+      cairo_set_source_rgb(cr, ((color >> 16) & 0xFF) / 255.0, ((color >> 8) & 0xFF) / 255.0, (color & 0xFF) / 255.0);
+      cairo_paint(cr);
+      cairo_destroy(cr);
+    }
+    self->mLayer->EndPaint(inWindow, context);
+    return 0;
+  }
+  return self->mLayer->DefaultWindowProcedure(inWindow, inMessage, inWParam, inLParam);
+}
+
+ui::OS_WindowHandle X11Fixture::MakeShownWindow(const ui::OS_Rect& inRect, std::uint32_t inColor, std::uint32_t inStyle,
+                                                std::uint32_t inExStyle, ui::OS_WindowHandle inOwner) {
+  ui::OS_WindowCreateParams params;
+  params.title = u"norvik test";
+  params.rect = inRect;
+  params.style = inStyle;
+  params.exStyle = inExStyle;
+  params.parent = inOwner;
+  const ui::OS_WindowHandle window = mLayer->CreateWindow(params);
+  mColors[window] = inColor;
+  const std::size_t before = MessagesOf(ui::kOSMsgPaint).size();
+  mLayer->ShowWindow(window, (inExStyle & ui::kOSExStyleNoActivate) ? ui::kOSShowNA : ui::kOSShow);
+  WaitFor([&] { return MessagesOf(ui::kOSMsgPaint).size() > before; });
+  Settle(50);
+  return window;
+}
+
+bool X11Fixture::WaitFor(const std::function<bool()>& inCondition, int inMilliseconds) {
+  const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(inMilliseconds);
+  while (std::chrono::steady_clock::now() < end) {
+    mLayer->ProcessPendingEvents();
+    if (inCondition()) return true;
+    usleep(2000);
+  }
+  mLayer->ProcessPendingEvents();
+  return inCondition();
+}
+
+void X11Fixture::Settle(int inMilliseconds) {
+  WaitFor([] { return false; }, inMilliseconds);
+}
+
+std::vector<RecordedMessage> X11Fixture::MessagesOf(unsigned inMessage) const {
+  std::vector<RecordedMessage> result;
+  for (const RecordedMessage& m : mMessages)
+    if (m.message == inMessage) result.push_back(m);
+  return result;
+}
+
+void X11Fixture::MovePointer(int inX, int inY) {
+  xcb_screen_t* screen = xcb_setup_roots_iterator(xcb_get_setup(mUser)).data;
+  xcb_test_fake_input(mUser, XCB_MOTION_NOTIFY, 0, XCB_CURRENT_TIME, screen->root, static_cast<int16_t>(inX),
+                      static_cast<int16_t>(inY), 0);
+  xcb_flush(mUser);
+}
+
+void X11Fixture::Button(int inButton, bool inPress) {
+  xcb_test_fake_input(mUser, inPress ? XCB_BUTTON_PRESS : XCB_BUTTON_RELEASE, static_cast<uint8_t>(inButton),
+                      XCB_CURRENT_TIME, XCB_NONE, 0, 0, 0);
+  xcb_flush(mUser);
+}
+
+void X11Fixture::Key(std::uint32_t inKeysym, bool inPress) {
+  const xcb_setup_t* setup = xcb_get_setup(mUser);
+  const int count = setup->max_keycode - setup->min_keycode + 1;
+  xcb_get_keyboard_mapping_reply_t* map = xcb_get_keyboard_mapping_reply(
+      mUser, xcb_get_keyboard_mapping(mUser, setup->min_keycode, static_cast<uint8_t>(count)), nullptr);
+  ASSERT_NE(map, nullptr);
+  const xcb_keysym_t* syms = xcb_get_keyboard_mapping_keysyms(map);
+  xcb_keycode_t found = 0;
+  for (int i = 0; i < count && !found; ++i)
+    if (syms[i * map->keysyms_per_keycode] == inKeysym) found = static_cast<xcb_keycode_t>(setup->min_keycode + i);
+  std::free(map);
+  ASSERT_NE(found, 0) << "no key types keysym " << inKeysym;
+  xcb_test_fake_input(mUser, inPress ? XCB_KEY_PRESS : XCB_KEY_RELEASE, found, XCB_CURRENT_TIME, XCB_NONE, 0, 0, 0);
+  xcb_flush(mUser);
+}
+
+std::uint32_t X11Fixture::ReadPixel(ui::OS_WindowHandle inWindow, int inX, int inY) {
+  xcb_get_image_reply_t* image = xcb_get_image_reply(
+      mUser,
+      xcb_get_image(mUser, XCB_IMAGE_FORMAT_Z_PIXMAP, static_cast<xcb_drawable_t>(inWindow), static_cast<int16_t>(inX),
+                    static_cast<int16_t>(inY), 1, 1, ~0u),
+      nullptr);
+  if (!image) return 0xFFFFFFFF;
+  const std::uint8_t* data = xcb_get_image_data(image);
+  const std::uint32_t pixel = (std::uint32_t(data[2]) << 16) | (std::uint32_t(data[1]) << 8) | data[0];
+  std::free(image);
+  return pixel;
+}
+
+}  // namespace norvik::test
