@@ -5,6 +5,8 @@
 set -euo pipefail
 cd "$(dirname "$0")/.."
 PRESET="${1:-release}"
+# Paths below the checkout count as relative for ccache, so clones share the cache.
+export CCACHE_BASEDIR="$PWD"
 bash scripts/install-deps.sh
 bash scripts/check-layering.sh
 cmake --preset "$PRESET" >/dev/null
