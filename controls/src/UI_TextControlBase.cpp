@@ -1,10 +1,12 @@
 #include "controls/UI_TextControlBase.h"
 
 #include <cmath>
+#include <map>
 
 #include "controls/UI_ControlView.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
+#include "drawbot/FontFamilies.h"
 #include "ui/UI_NodeManager.h"
 
 namespace norvik::controls {
@@ -16,6 +18,21 @@ constexpr std::uint64_t kDisabledLabelColor = 7;
 
 const unsigned short* Chars(const UTF16String& inText) {
   return reinterpret_cast<const unsigned short*>(inText.c_str());
+}
+
+// The theme names the fonts it would like; the platform may have another. The
+// answer for each name is kept, because asking the font matcher on every
+// paint of every label would dominate drawing. Used on the UI thread only.
+const UTF16String& ResolvedFamily(const UTF16String& inName) {
+  static std::map<UTF16String, UTF16String> resolved;
+  auto it = resolved.find(inName);
+  if (it == resolved.end()) it = resolved.emplace(inName, drawbot::ChooseFontFamily({inName})).first;
+  return it->second;
+}
+
+drawbot::FontP LabelFont(const drawbot::SupplierInterface* inSupplier, const DrawTextControlBaseParameters& inText) {
+  const float size = inText.GetFontSize() > 0 ? inText.GetFontSize() : 11.0f;
+  return drawbot::FontP(inSupplier, ResolvedFamily(inText.GetFontName()), inText.GetFontStyleName(), size);
 }
 }  // namespace
 
@@ -35,7 +52,7 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
   const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
   drawbot::SurfaceInterface* surface = inDrawbot.GetSurface();
   if (text.empty() || !supplier || !surface || inRect.width <= 0 || !supplier->SupportsFonts()) return;
-  drawbot::FontP font(supplier, inText.GetFontName(), inText.GetFontStyleName(), inText.GetFontSize());
+  drawbot::FontP font = LabelFont(supplier, inText);
   const bool disabled = inParams.GetControlState().Test(UI_ControlView::kStateDisabled);
   drawbot::BrushP brush(supplier, inParams.Color(disabled ? kDisabledLabelColor : kLabelColor));
   if (!font || !brush) return;
@@ -62,7 +79,7 @@ float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
   const drawbot::SupplierInterface* supplier = manager ? manager->GetOSDrawSupplier() : nullptr;
   if (!supplier || inLabel.empty()) return 0;
-  drawbot::FontP font(supplier, inText.GetFontName(), inText.GetFontStyleName(), inText.GetFontSize());
+  drawbot::FontP font = LabelFont(supplier, inText);
   return font ? font->MeasureStringWidth(Chars(inLabel), static_cast<long>(inLabel.size())) : 0;
 }
 

@@ -1,0 +1,125 @@
+// The looks of the buttons, drawn by their stateless Draw routines with no
+// control, in each state, in the dark and the light theme, compared with
+// reference images.
+#include <functional>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "controls/UI_Checkbox.h"
+#include "controls/UI_DisclosureTriangleButton.h"
+#include "controls/UI_RadioButton.h"
+#include "controls/UI_TextButton.h"
+#include "drawbot/Drawbot.h"
+#include "support/drawbot/PixelCompare.h"
+#include "ui/KeyframeThemeEditor.h"
+
+namespace norvik::controls::test {
+namespace {
+
+using drawbot::testing::MatchesReference;
+using drawbot::testing::PixelCanvas;
+using RectF = tarsel::geom::RectT<float>;
+using StateFlags = DrawParameters::StateFlags;
+
+constexpr int kCellWidth = 96;
+constexpr int kCellHeight = 26;
+
+struct Look {
+  const char* name;
+  unsigned long state;
+};
+constexpr Look kLooks[] = {{"normal", 0},
+                           {"rollover", UI_ControlView::kStateRollover},
+                           {"down", UI_ControlView::kStateDown | UI_ControlView::kStateRollover},
+                           {"disabled", UI_ControlView::kStateDisabled},
+                           {"focused", UI_ControlView::kStateFocused}};
+constexpr int kLookCount = sizeof(kLooks) / sizeof(kLooks[0]);
+
+// Draws one cell; inVariant is 0 for the off look, 1 for the on look.
+using CellPainter = std::function<void(const ui::ThemeP&, StateFlags, int, const RectF&, drawbot::Drawbot&)>;
+
+class ButtonPixelTest : public ::testing::TestWithParam<bool> {
+ protected:
+  ButtonPixelTest() : theme(ui::MakeDefaultKeyframeTheme()) { theme->SetBrightness(GetParam() ? 0.85f : 0.25f); }
+
+  // Two columns (off, on) of the five looks over the theme's background.
+  drawbot::testing::PixelImage Render(const CellPainter& inPaint) {
+    PixelCanvas canvas(2 * kCellWidth, kLookCount * kCellHeight);
+    canvas.Clear(theme->GetColor(4).ToPacked() & 0xFFFFFF);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    for (int variant = 0; variant < 2; ++variant)
+      for (int i = 0; i < kLookCount; ++i)
+        inPaint(theme, StateFlags(kLooks[i].state), variant,
+                RectF(static_cast<float>(variant * kCellWidth + 4), static_cast<float>(i * kCellHeight + 2),
+                      kCellWidth - 8, kCellHeight - 4),
+                drawbot);
+    return canvas.Snapshot();
+  }
+  std::string Name(const char* inKind) const {
+    return std::string("controls/") + inKind + (GetParam() ? "_light" : "_dark");
+  }
+
+  ui::KeyframeThemeEditorP theme;
+};
+
+TEST_P(ButtonPixelTest, TextButtonsInEachState) {
+  const auto image = Render([](const ui::ThemeP& inTheme, StateFlags inState, int inVariant, const RectF& inRect,
+                               drawbot::Drawbot& inDrawbot) {
+    DrawTextButtonParameters params;
+    params.SetTheme(inTheme);
+    params.SetRectF(inRect);
+    params.SetControlState(inState);
+    params.SetText(u"Render");
+    params.SetDefaultAppearance(inVariant == 1);
+    UI_TextButton::Draw(params, inDrawbot);
+  });
+  EXPECT_TRUE(MatchesReference(image, Name("text_button")));
+}
+
+TEST_P(ButtonPixelTest, CheckboxesInEachState) {
+  const auto image = Render([](const ui::ThemeP& inTheme, StateFlags inState, int inVariant, const RectF& inRect,
+                               drawbot::Drawbot& inDrawbot) {
+    DrawCheckBoxParams params;
+    params.SetTheme(inTheme);
+    params.SetRectF(inRect);
+    params.SetControlState(inState);
+    params.SetText(u"Loop");
+    params.SetTextAlignment(drawbot::kTextAlignLeft);
+    params.SetValue(inVariant == 1 ? UI_Checkbox::kOn : UI_Checkbox::kOff);
+    UI_Checkbox::Draw(params, inDrawbot);
+  });
+  EXPECT_TRUE(MatchesReference(image, Name("checkbox")));
+}
+
+TEST_P(ButtonPixelTest, RadioButtonsInEachState) {
+  const auto image = Render([](const ui::ThemeP& inTheme, StateFlags inState, int inVariant, const RectF& inRect,
+                               drawbot::Drawbot& inDrawbot) {
+    DrawRadioButtonParams params;
+    params.SetTheme(inTheme);
+    params.SetRectF(inRect);
+    params.SetControlState(inState);
+    params.SetText(u"Stereo");
+    params.SetOn(inVariant == 1);
+    UI_RadioButton::Draw(params, inDrawbot);
+  });
+  EXPECT_TRUE(MatchesReference(image, Name("radio_button")));
+}
+
+TEST_P(ButtonPixelTest, DisclosureTrianglesClosedAndOpen) {
+  const auto image = Render([](const ui::ThemeP& inTheme, StateFlags inState, int inVariant, const RectF& inRect,
+                               drawbot::Drawbot& inDrawbot) {
+    DrawParameters params;
+    params.SetTheme(inTheme);
+    params.SetControlState(inState);
+    UI_DisclosureTriangleButton::DrawTriangle(params, RectF(inRect.left, inRect.top + 5, 12, 12),
+                                              inVariant == 1 ? 90.0f : 0.0f, inDrawbot);
+  });
+  EXPECT_TRUE(MatchesReference(image, Name("disclosure_triangle")));
+}
+
+INSTANTIATE_TEST_SUITE_P(Themes, ButtonPixelTest, ::testing::Values(false, true),
+                         [](const ::testing::TestParamInfo<bool>& inInfo) { return inInfo.param ? "Light" : "Dark"; });
+
+}  // namespace
+}  // namespace norvik::controls::test
