@@ -76,6 +76,12 @@ class UI_NodeManager : private boost::noncopyable {
   CustomSettingsManager* GetCustomSettingsManager() const { return mCustomSettingsManager.get(); }
   DrawbotImageResourceCache* GetDrawbotImageResourceCache() const { return mImageCache.get(); }
   drawbot::SupplierInterface* GetOSDrawSupplier() const { return mOSSupplier.get(); }
+  // The resource image of this name for inSupplier, through the image cache
+  // and the resource manager; it stays valid while the cache holds it. A
+  // missing cache is a contract violation; a missing image raises the
+  // resource error naming it.
+  const drawbot::ImageInterface* GetImage(const drawbot::SupplierInterface* inSupplier, const UTF8String& inName,
+                                          drawbot::ImageFileType inFileType) const;
   // Raises "Unable to access resource." when there is no resource manager.
   ResourceManager& GetResourceManager() const;
   const InputCaptureP& GetInputCapture() const { return mInputCapture; }

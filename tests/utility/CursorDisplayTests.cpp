@@ -1,0 +1,198 @@
+// Showing cursors on the headless system: the platform's cursors by number,
+// the toolkit's drawn cursors with the pixels and hot spot of their
+// pictures, registered pictures made on first display, and disposal.
+#include <filesystem>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "drawbot/DrawbotWrappers.h"
+#include "support/drawbot/PixelCompare.h"
+#include "tarsel/ThrowError.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/OS_WindowConstants.h"
+#include "utility/CursorUtils.h"
+#include "utility/OS_ResourceManager.h"
+
+namespace norvik::utility {
+namespace {
+
+using drawbot::testing::PixelCanvas;
+using drawbot::testing::PixelImage;
+
+struct CursorPicture {
+  std::vector<std::uint32_t> pixels;
+  ui::OS_Point size{0, 0};
+  ui::OS_Point hotSpot{0, 0};
+};
+
+class CursorDisplay : public ::testing::Test {
+ protected:
+  void SetUp() override { mSystem.Install(); }
+
+  ui::OS_CursorHandle InForce() { return mSystem.GetLayer().GetCursor(); }
+
+  bool PictureOf(ui::OS_CursorHandle inCursor, CursorPicture& outPicture) {
+    return mSystem.GetCursorImage(inCursor, outPicture.pixels, outPicture.size, outPicture.hotSpot);
+  }
+
+  // The pixels of a library picture, decoded and drawn the ordinary way.
+  PixelImage Decoded(const char16_t* inName) {
+    std::vector<char> bytes;
+    mResources.GetBinary(inName, u"png", &bytes);
+    drawbot::FileImageP probe(drawbot::NewOSSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
+                              static_cast<unsigned long>(bytes.size()));
+    PixelCanvas canvas(static_cast<int>(probe->GetWidth()), static_cast<int>(probe->GetHeight()));
+    drawbot::FileImageP image(canvas.GetSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
+                              static_cast<unsigned long>(bytes.size()));
+    canvas.GetSurface()->DrawImage(*image, tarsel::geom::PointT<float>(0, 0), 1);
+    return canvas.Snapshot();
+  }
+
+  ui::HeadlessWindowSystem mSystem;
+  OS_ResourceManager mResources;
+};
+
+TEST_F(CursorDisplay, PlatformNumbersShowThePlatformsCursors) {
+  const std::pair<int, int> expected[] = {{0, ui::kOSCursorArrow}, {2, ui::kOSCursorWait},
+                                          {3, ui::kOSCursorCross}, {4, ui::kOSCursorNo},
+                                          {5, ui::kOSCursorArrow}, {6, ui::kOSCursorArrow}};
+  for (auto const& [id, system] : expected) {
+    SCOPED_TRACE(id);
+    mResources.DisplayCursor(id == 2 ? 3 : 2);  // another cursor first, so each check sees a change
+    mResources.DisplayCursor(id);
+    EXPECT_EQ(InForce(), mSystem.GetLayer().LoadSystemCursor(system));
+  }
+}
+
+TEST_F(CursorDisplay, ADrawnCursorCarriesThePixelsAndHotSpotOfItsPicture) {
+  mResources.DisplayCursor(26);
+  CursorPicture picture;
+  ASSERT_TRUE(PictureOf(InForce(), picture));
+  const PixelImage expected = Decoded(u"CursorID-26");
+  EXPECT_EQ(picture.size.x, expected.width);
+  EXPECT_EQ(picture.size.y, expected.height);
+  EXPECT_EQ(picture.pixels, expected.pixels);
+  EXPECT_EQ(picture.hotSpot.x, 0);
+  EXPECT_EQ(picture.hotSpot.y, 0);
+  // The tip of the arrow is drawn, and the far corner is clear.
+  EXPECT_NE(picture.pixels.front() >> 24, 0u);
+  EXPECT_EQ(picture.pixels[static_cast<std::size_t>(picture.size.x) - 1] >> 24, 0u);
+}
+
+TEST_F(CursorDisplay, TheTwoDrawnCursorsDifferAndAreMadeOnce) {
+  mResources.DisplayCursor(26);
+  const ui::OS_CursorHandle add = InForce();
+  mResources.DisplayCursor(27);
+  const ui::OS_CursorHandle link = InForce();
+  EXPECT_NE(add, link);
+  CursorPicture a, b;
+  ASSERT_TRUE(PictureOf(add, a));
+  ASSERT_TRUE(PictureOf(link, b));
+  EXPECT_NE(a.pixels, b.pixels);
+  mResources.DisplayCursor(26);
+  EXPECT_EQ(InForce(), add);
+  ASSERT_NE(mResources.FindCursorInfo(26), nullptr);
+  EXPECT_TRUE(mResources.FindCursorInfo(26)->loaded);
+}
+
+TEST_F(CursorDisplay, ANumberWithoutAPictureFallsBackToTheArrow) {
+  mResources.DisplayCursor(3);
+  mResources.DisplayCursor(12);
+  EXPECT_EQ(InForce(), mSystem.GetLayer().LoadSystemCursor(ui::kOSCursorArrow));
+  EXPECT_EQ(mResources.FindCursorInfo(12), nullptr);
+}
+
+TEST_F(CursorDisplay, ARegisteredPictureIsMadeOnlyWhenFirstShown) {
+  const std::string path = std::string(NORVIK_TEST_OUTPUT_DIR) + "/cursor-3x2.png";
+  std::filesystem::create_directories(NORVIK_TEST_OUTPUT_DIR);
+  const PixelImage picture{3, 2, {0xff0000ffu, 0x80800000u, 0x00000000u, 0xffffffffu, 0xff000000u, 0x40004000u}};
+  ASSERT_TRUE(drawbot::testing::SavePNG(picture, path));
+
+  mResources.DisplayCursor(0);
+  const ui::OS_CursorHandle before = InForce();
+  mResources.MakeCursorFromPNG(40, tarsel::utility::UTF8to16(path), 2, 1, ui::LoadByPolicy::kByPath);
+  EXPECT_EQ(InForce(), before);
+  ASSERT_NE(mResources.FindCursorInfo(40), nullptr);
+  EXPECT_FALSE(mResources.FindCursorInfo(40)->loaded);
+
+  mResources.DisplayCursor(40);
+  CursorPicture shown;
+  ASSERT_TRUE(PictureOf(InForce(), shown));
+  EXPECT_EQ(shown.pixels, picture.pixels);
+  EXPECT_EQ(shown.hotSpot.x, 2);
+  EXPECT_EQ(shown.hotSpot.y, 1);
+}
+
+TEST_F(CursorDisplay, ARegistrationByResourceTakesThePictureByName) {
+  mResources.MakeCursorFromPNG(41, u"rv4_pickwhip_n", 5, 6, ui::LoadByPolicy::kByResource);
+  mResources.DisplayCursor(41);
+  CursorPicture shown;
+  ASSERT_TRUE(PictureOf(InForce(), shown));
+  EXPECT_EQ(shown.pixels, Decoded(u"RV4_PickWhip_N").pixels);
+  EXPECT_EQ(shown.hotSpot.x, 5);
+  EXPECT_EQ(shown.hotSpot.y, 6);
+}
+
+TEST_F(CursorDisplay, AMissingRegisteredPictureRaisesAndLeavesTheCursorInForce) {
+  mResources.DisplayCursor(2);
+  const ui::OS_CursorHandle before = InForce();
+  mResources.MakeCursorFromPNG(42, u"NoSuchCursorPicture", 0, 0, ui::LoadByPolicy::kByResource);
+  try {
+    mResources.DisplayCursor(42);
+    ADD_FAILURE() << "no error";
+  } catch (tarsel::config::Exception const& e) {
+    EXPECT_STREQ(e.what(), "Unable to access resource 'NoSuchCursorPicture' (type png)");
+  }
+  EXPECT_EQ(InForce(), before);
+  mResources.MakeCursorFromPNG(43, u"/no/such/dir/cursor.png", 0, 0, ui::LoadByPolicy::kByPath);
+  EXPECT_THROW(mResources.DisplayCursor(43), tarsel::config::Exception);
+  EXPECT_EQ(InForce(), before);
+}
+
+TEST_F(CursorDisplay, DisposingReleasesTheNativeCursorAndTheNextDisplayMakesItAgain) {
+  mResources.DisplayCursor(27);
+  const ui::OS_CursorHandle first = InForce();
+  mResources.DisplayCursor(0);
+  mResources.DisposeCursor(27);
+  CursorPicture gone;
+  EXPECT_FALSE(PictureOf(first, gone));
+  EXPECT_FALSE(mResources.FindCursorInfo(27)->loaded);
+  mResources.DisplayCursor(27);
+  CursorPicture again;
+  EXPECT_TRUE(PictureOf(InForce(), again));
+}
+
+TEST_F(CursorDisplay, ACursorFromAnImageKeepsItsHotSpotInsideThePicture) {
+  const PixelImage decoded = Decoded(u"CursorID-27");
+  std::vector<char> bytes;
+  mResources.GetBinary(u"CursorID-27", u"png", &bytes);
+  drawbot::FileImageP image(drawbot::NewOSSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
+                            static_cast<unsigned long>(bytes.size()));
+  const ui::OS_CursorHandle inside = DisplayCursorFromImage(image.GetPtr(), 4, 9);
+  EXPECT_EQ(InForce(), inside);
+  CursorPicture picture;
+  ASSERT_TRUE(PictureOf(inside, picture));
+  EXPECT_EQ(picture.pixels, decoded.pixels);
+  EXPECT_EQ(picture.hotSpot.x, 4);
+  EXPECT_EQ(picture.hotSpot.y, 9);
+
+  const ui::OS_CursorHandle outside = GetCursorFromImage(image.GetPtr(), 500, -3);
+  ASSERT_TRUE(PictureOf(outside, picture));
+  EXPECT_EQ(picture.hotSpot.x, decoded.width - 1);
+  EXPECT_EQ(picture.hotSpot.y, 0);
+  DisposeCursor(outside);
+  EXPECT_FALSE(PictureOf(outside, picture));
+  EXPECT_EQ(GetCursorFromImage(nullptr, 0, 0), 0u);
+}
+
+TEST(CursorWithoutPlatform, NothingIsShownAndNothingFails) {
+  ASSERT_EQ(ui::GetNativeLayer(), nullptr);
+  OS_ResourceManager resources;
+  EXPECT_NO_THROW(resources.DisplayCursor(26));
+  EXPECT_NO_THROW(resources.DisplayCursor(0));
+  EXPECT_EQ(resources.FindCursorInfo(26), nullptr);
+}
+
+}  // namespace
+}  // namespace norvik::utility

@@ -1,0 +1,167 @@
+// The image cache: one decoded image per name, file type and kind of
+// supplier, read through a resource manager only on a miss; and the node
+// manager's lookup through it.
+#include <functional>
+#include <memory>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "drawbot/DrawbotWrappers.h"
+#include "drawbot/SupplierInterface.h"
+#include "support/drawbot/RecordingSupplier.h"
+#include "support/utility/MemoryResourceManager.h"
+#include "tarsel/Contract.h"
+#include "tarsel/ThrowError.h"
+#include "ui/DrawbotImageResourceCache.h"
+#include "ui/UI_NodeManager.h"
+#include "utility/OS_ResourceManager.h"
+
+namespace norvik::utility {
+namespace {
+
+using drawbot::kImageFileTypePNG;
+using ui::DrawbotImageResourceCache;
+
+std::string ErrorOf(std::function<void()> const& inCall) {
+  try {
+    inCall();
+  } catch (tarsel::config::Exception const& e) {
+    return e.what();
+  }
+  return "no error";
+}
+
+class ImageCache : public ::testing::Test {
+ protected:
+  std::string PNGBytes(const char* inName) {
+    std::vector<char> bytes;
+    mLibrary.GetBinary(tarsel::utility::AsciiToUTF16(inName), u"png", &bytes);
+    return std::string(bytes.begin(), bytes.end());
+  }
+
+  OS_ResourceManager mLibrary;
+  testing::MemoryResourceManager mMemory;
+  DrawbotImageResourceCache mCache;
+  boost::intrusive_ptr<drawbot::testing::RecordingSupplier> mRecording{new drawbot::testing::RecordingSupplier()};
+  boost::intrusive_ptr<drawbot::testing::RecordingSupplier> mOtherRecording{
+      new drawbot::testing::RecordingSupplier()};
+  drawbot::SupplierInterface* mPlatform = drawbot::NewOSSupplier();
+};
+
+TEST_F(ImageCache, ASecondRequestAnswersTheSameImageWithoutReadingAgain) {
+  mMemory.Put("RV4_Close_Normal", "png", PNGBytes("RV4_Close_Normal"));
+  auto first = mCache.GetImage(&mMemory, mPlatform, "RV4_Close_Normal", kImageFileTypePNG);
+  auto second = mCache.GetImage(&mMemory, mPlatform, "RV4_Close_Normal", kImageFileTypePNG);
+  ASSERT_TRUE(first);
+  EXPECT_EQ(first.get(), second.get());
+  EXPECT_EQ(mMemory.GetReadCount(), 1);
+  EXPECT_EQ(first->GetWidth(), 12u);
+}
+
+TEST_F(ImageCache, SuppliersOfDifferentKindsGetImagesOfTheirOwn) {
+  auto platform = mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", kImageFileTypePNG);
+  auto recording = mCache.GetImage(&mLibrary, mRecording.get(), "SP_Add_Sm_N", kImageFileTypePNG);
+  EXPECT_NE(platform.get(), recording.get());
+  EXPECT_EQ(mCache.GetSize(), 2u);
+  EXPECT_EQ(mCache.FindImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG).get(), platform.get());
+  EXPECT_EQ(mCache.FindImage(mRecording.get(), "SP_Add_Sm_N", kImageFileTypePNG).get(), recording.get());
+}
+
+TEST_F(ImageCache, TwoSuppliersOfTheSameKindShareTheEntry) {
+  auto first = mCache.GetImage(&mLibrary, mRecording.get(), "Gripper", kImageFileTypePNG);
+  auto second = mCache.GetImage(&mLibrary, mOtherRecording.get(), "Gripper", kImageFileTypePNG);
+  EXPECT_EQ(first.get(), second.get());
+  EXPECT_EQ(mCache.GetSize(), 1u);
+}
+
+TEST_F(ImageCache, NamesThatDifferOnlyInCaseAreSeparateEntriesOfTheSamePicture) {
+  // The resource table ignores case; the cache key does not, so the cost of
+  // mixed spellings is a second decode, never a wrong picture.
+  auto mixed = mCache.GetImage(&mLibrary, mPlatform, "RV4_Gripper", kImageFileTypePNG);
+  auto upper = mCache.GetImage(&mLibrary, mPlatform, "RV4_GRIPPER", kImageFileTypePNG);
+  EXPECT_NE(mixed.get(), upper.get());
+  EXPECT_EQ(mixed->GetWidth(), upper->GetWidth());
+  EXPECT_EQ(mixed->GetHeight(), upper->GetHeight());
+}
+
+TEST_F(ImageCache, FindDoesNotLoadAndRemoveForgets) {
+  EXPECT_FALSE(mCache.FindImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG));
+  auto image = mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", kImageFileTypePNG);
+  EXPECT_TRUE(mCache.RemoveCachedImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG));
+  EXPECT_FALSE(mCache.RemoveCachedImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG));
+  EXPECT_FALSE(mCache.FindImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG));
+  auto again = mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", kImageFileTypePNG);
+  EXPECT_NE(again.get(), image.get());
+}
+
+TEST_F(ImageCache, AnImageMadeElsewhereIsAnsweredWithoutTouchingTheResources) {
+  drawbot::FileImageP made(mRecording.get(), kImageFileTypePNG, "x", 1);
+  mCache.CacheImage(mRecording.get(), "Painted", kImageFileTypePNG, made.GetPtr());
+  auto found = mCache.GetImage(&mMemory, mRecording.get(), "Painted", kImageFileTypePNG);
+  EXPECT_EQ(found.get(), made.Get());
+  EXPECT_EQ(mMemory.GetReadCount(), 0);
+}
+
+TEST_F(ImageCache, AMissingNameRaisesTheResourceErrorAndCachesNothing) {
+  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "RV4_NoSuchIcon_N", kImageFileTypePNG); }),
+            "Unable to access resource 'RV4_NoSuchIcon_N' (type png)");
+  EXPECT_EQ(mCache.GetSize(), 0u);
+}
+
+TEST_F(ImageCache, AnImageWithoutItsLightPanelVariantFailsAtTheResource) {
+  EXPECT_NO_THROW(mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap", kImageFileTypePNG));
+  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap_D", kImageFileTypePNG); }),
+            "Unable to access resource 'RV4_FBColorSwap_D' (type png)");
+}
+
+TEST_F(ImageCache, AFileTypeWithoutResourcesAsksForAnEmptyType) {
+  const auto jpeg = static_cast<drawbot::ImageFileType>(1);
+  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", jpeg); }),
+            "Unable to access resource 'SP_Add_Sm_N' (type )");
+}
+
+TEST_F(ImageCache, BytesThatAreNoPictureRaiseTheDecodersErrorAndCacheNothing) {
+  mMemory.Put("Broken", "png", "this is not a PNG file");
+  EXPECT_THROW(mCache.GetImage(&mMemory, mPlatform, "Broken", kImageFileTypePNG), tarsel::config::Exception);
+  EXPECT_EQ(mCache.GetSize(), 0u);
+}
+
+TEST_F(ImageCache, ClearDropsEveryEntry) {
+  mCache.GetImage(&mLibrary, mPlatform, "Gripper", kImageFileTypePNG);
+  mCache.GetImage(&mLibrary, mRecording.get(), "Gripper", kImageFileTypePNG);
+  mCache.Clear();
+  EXPECT_EQ(mCache.GetSize(), 0u);
+}
+
+TEST(NodeManagerImages, GetImageGoesThroughTheManagersCacheAndResources) {
+  ui::UI_NodeManager manager;
+  manager.SetResourceManager(std::make_unique<OS_ResourceManager>());
+  manager.SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
+  drawbot::SupplierInterface* platform = drawbot::NewOSSupplier();
+  const drawbot::ImageInterface* image = manager.GetImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG);
+  ASSERT_NE(image, nullptr);
+  EXPECT_EQ(image->GetWidth(), 16u);
+  EXPECT_EQ(manager.GetImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG), image);
+  EXPECT_EQ(manager.GetDrawbotImageResourceCache()->FindImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG).get(),
+            image);
+}
+
+TEST(NodeManagerImages, WithoutAResourceManagerGetImageRaisesTheAccessError) {
+  ui::UI_NodeManager manager;
+  manager.SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
+  EXPECT_EQ(ErrorOf([&] { manager.GetImage(drawbot::NewOSSupplier(), "Gripper", kImageFileTypePNG); }),
+            "Unable to access resource.");
+}
+
+TEST(NodeManagerImages, WithoutACacheGetImageIsAContractViolation) {
+  ui::UI_NodeManager manager;
+  manager.SetResourceManager(std::make_unique<OS_ResourceManager>());
+  manager.TerminateDrawing();
+  const long before = tarsel::debug::GetContractViolationCount();
+  EXPECT_THROW(manager.GetImage(drawbot::NewOSSupplier(), "Gripper", kImageFileTypePNG), tarsel::config::Exception);
+  EXPECT_EQ(tarsel::debug::GetContractViolationCount(), before + 1);
+}
+
+}  // namespace
+}  // namespace norvik::utility
