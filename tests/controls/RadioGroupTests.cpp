@@ -1,0 +1,101 @@
+// Radio groups: one button on at a time, the group's listeners hear the
+// children's changes as the group's, and arrows move the selection without
+// wrapping at either end.
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "controls/UI_RadioGroup.h"
+#include "support/controls/ControlTestSupport.h"
+
+namespace norvik::controls::test {
+namespace {
+
+using ::testing::ElementsAre;
+
+constexpr short kLeft = 37;
+constexpr short kRight = 39;
+
+class RadioGroupTest : public ControlTest {
+ protected:
+  RadioGroupTest() : group(Add(new UI_RadioGroup, RectF(0, 0, 200, 100))) {
+    for (int i = 0; i < 3; ++i) {
+      UI_RadioButtonP radio(new UI_RadioButton(u"Option"));
+      radio->UI_SetLocalRectF(RectF(10, 10 + 20.0f * i, 100, 16));
+      radio->UI_Show(true);
+      radio->SetWantsKeyboardFocus(true);
+      group->ChildPushBack(radio);
+      radios.push_back(radio);
+    }
+  }
+  void Click(int inIndex) {
+    Press(PointF(15, 15 + 20.0f * inIndex));
+    Release(PointF(15, 15 + 20.0f * inIndex));
+  }
+  std::vector<int> Values() const {
+    std::vector<int> out;
+    for (const auto& radio : radios) out.push_back(radio->GetValue());
+    return out;
+  }
+
+  boost::intrusive_ptr<UI_RadioGroup> group;
+  std::vector<UI_RadioButtonP> radios;
+};
+
+TEST_F(RadioGroupTest, ClickingAButtonTurnsTheOthersOff) {
+  Click(0);
+  Click(2);
+  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
+  EXPECT_EQ(group->GetIndex(), 2);
+  EXPECT_EQ(group->GetSelectedRadioButton(), radios[2].get());
+}
+
+TEST_F(RadioGroupTest, TheGroupsListenersHearTheChildsChangeAsTheGroups) {
+  std::vector<UI_ControlView*> controls;
+  group->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
+      [&](UI_ControlChangedMessage* inMessage) { controls.push_back(inMessage->GetControl()); }));
+  Click(1);
+  EXPECT_THAT(controls, ElementsAre(group.get()));
+}
+
+TEST_F(RadioGroupTest, SetIndexSelectsByPosition) {
+  group->SetIndex(1);
+  EXPECT_THAT(Values(), ElementsAre(0, 1, 0));
+  EXPECT_TRUE(group->IsValueKnown());
+}
+
+TEST_F(RadioGroupTest, ArrowsMoveTheSelectionAndTheFocus) {
+  group->SetIndex(0);
+  radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  EXPECT_TRUE(KeyDown(radios[0].get(), kRight, 0));
+  EXPECT_THAT(Values(), ElementsAre(0, 1, 0));
+  EXPECT_TRUE(radios[1]->UI_HasKeyboardFocus(false));
+}
+
+TEST_F(RadioGroupTest, ArrowsDoNotWrapAtTheEnds) {
+  group->SetIndex(2);
+  radios[2]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  KeyDown(radios[2].get(), kRight, 0);
+  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
+  group->SetIndex(0);
+  radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  KeyDown(radios[0].get(), kLeft, 0);
+  EXPECT_THAT(Values(), ElementsAre(1, 0, 0));
+}
+
+TEST_F(RadioGroupTest, ArrowsSkipDisabledButtons) {
+  group->SetIndex(0);
+  radios[1]->SetEnabled(false);
+  radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  KeyDown(radios[0].get(), kRight, 0);
+  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
+}
+
+TEST_F(RadioGroupTest, ARemovedButtonLeavesTheGroup) {
+  group->ChildRemove(radios[2].get());
+  group->SetIndex(2);
+  EXPECT_EQ(group->GetIndex(), -1);
+  EXPECT_EQ(radios[2]->GetValue(), UI_Button::kButtonOff);
+}
+
+}  // namespace
+}  // namespace norvik::controls::test
