@@ -10,6 +10,8 @@
 #include <string_view>
 #include <variant>
 
+#include "ui/OS_Preferences.h"
+
 namespace norvik::ui {
 
 class CustomSettingsManager {
@@ -23,6 +25,12 @@ class CustomSettingsManager {
   virtual void Reload();
   virtual std::optional<Value> Find(std::string_view inKey) const;
   virtual void Set(std::string_view inKey, Value inValue);
+  // Asks the platform for "apple.scrollbar.ArrowTogether" and
+  // "windows.MnemonicsAlwaysOn", in that order, and stores each answer.
+  void ReloadOSPreferences();
+  // The platform's answers; the native layer's by default. Null asks nothing.
+  void SetOSPreferences(OS_PreferencesP inPreferences) { mOSPreferences = std::move(inPreferences); }
+  const OS_PreferencesP& GetOSPreferences() const { return mOSPreferences; }
 
   // Typed reads. A value of another type answers the fallback, except that a
   // number is read as the other kind of number.
@@ -33,6 +41,7 @@ class CustomSettingsManager {
 
  protected:
   std::map<std::string, Value, std::less<>> mTable;
+  OS_PreferencesP mOSPreferences{new OS_NativePreferences};
 };
 
 }  // namespace norvik::ui

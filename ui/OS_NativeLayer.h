@@ -228,6 +228,10 @@ class OS_NativeLayer {
   // The active keyboard layout's answers to shortcut questions; null keeps the
   // built-in US layout.
   virtual const KeyboardLayoutInterface* GetKeyboardLayout() const { return nullptr; }
+  // The virtual key of a hardware scan code (the bits 16 to 23 of a key
+  // message's second parameter), 0 when unknown. The default knows the set-1
+  // codes of a US keyboard.
+  virtual int ScanCodeToVirtualKey(unsigned inScanCode) const;
 
   // ---- monitors and preferences ----
   virtual std::vector<OS_Monitor> GetMonitors() const = 0;

@@ -1,0 +1,172 @@
+// View containers: a top-level container painting its tree into the native
+// window, the rectangle applied again when a container gets a native parent,
+// popup-born windows turning into children, and popup backgrounds.
+#include <gmock/gmock.h>
+
+#include "support/ui/NativeWindowTestSupport.h"
+#include "ui/OS_OpenGLViewBase.h"
+#include "ui/OS_PopupWindow.h"
+#include "ui/Theme.h"
+
+namespace norvik::ui::test {
+namespace {
+
+using ViewContainerTest = NativeWindowTest;
+
+std::uint32_t Opaque(float inRed, float inGreen, float inBlue) {
+  auto channel = [](float v) { return static_cast<std::uint32_t>(v * 255.0f + 0.5f); };
+  return 0xFF000000u | (channel(inRed) << 16) | (channel(inGreen) << 8) | channel(inBlue);
+}
+
+TEST_F(ViewContainerTest, APaintedWindowShowsItsViewsPixels) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 120, 80));
+  auto back = AddView(window.get(), "back", 0, 0, 120, 80);
+  back->paints = true;
+  back->blue = 1.0f;
+  auto red = AddView(back.get(), "red", 20, 10, 30, 40);
+  red->paints = true;
+  red->red = 1.0f;
+  window->UI_Invalidate(nullptr, 0);
+  mSystem.Pump();
+
+  const HeadlessPixels pixels = mSystem.ReadWindowPixels(window->GetHandle());
+  ASSERT_EQ(pixels.width, 120);
+  ASSERT_EQ(pixels.height, 80);
+  EXPECT_EQ(pixels.At(25, 15), Opaque(1, 0, 0));
+  EXPECT_EQ(pixels.At(49, 49), Opaque(1, 0, 0));
+  EXPECT_EQ(pixels.At(50, 50), Opaque(0, 0, 1));
+  EXPECT_EQ(pixels.At(5, 5), Opaque(0, 0, 1));
+}
+
+TEST_F(ViewContainerTest, InvalidatingAViewRepaintsItWithItsNewColour) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 60, 60));
+  auto view = AddView(window.get(), "view", 0, 0, 60, 60);
+  view->paints = true;
+  view->green = 1.0f;
+  window->UI_Invalidate(nullptr, 0);
+  mSystem.Pump();
+  EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(0, 1, 0));
+  view->green = 0.0f;
+  view->red = 1.0f;
+  view->UI_Invalidate(nullptr, 0);
+  window->UI_Invalidate(nullptr, 0);
+  mSystem.Pump();
+  EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(1, 0, 0));
+}
+
+TEST_F(ViewContainerTest, ANewContainerIsAHiddenParentlessPopup) {
+  OS_ViewContainerP container(new OS_ViewContainer(true));
+  ASSERT_NE(container->GetHandle(), 0u);
+  EXPECT_FALSE(container->UI_IsShown());
+  EXPECT_EQ(mLayer.GetParent(container->GetHandle()), 0u);
+  EXPECT_NE(mLayer.GetStyle(container->GetHandle()) & kOSStylePopup, 0u);
+  EXPECT_EQ(container->UI_GetNodeID(), "OS_ViewContainer");
+}
+
+TEST_F(ViewContainerTest, ARectangleSetBeforeTheContainerHadAParentIsAppliedAgainAfterItArrives) {
+  auto top = MakeTopLevel(OS_Rect(100, 100, 400, 300));
+  OS_ViewContainerP container(new OS_ViewContainer(false));
+  container->UI_SetLocalRectF(UI_Node::RectF(10.5f, 20.0f, 50.0f, 40.0f));
+  top->ChildPushBack(container);
+  const OS_WindowHandle handle = container->GetHandle();
+  EXPECT_EQ(mLayer.GetParent(handle), top->GetHandle());
+  EXPECT_NE(mLayer.GetStyle(handle) & kOSStyleChild, 0u);
+  EXPECT_EQ(mLayer.GetStyle(handle) & kOSStylePopup, 0u);
+  // The enclosing integer rectangle, now in the parent's client coordinates.
+  EXPECT_EQ(mLayer.GetWindowRect(handle), OS_Rect(110, 120, 51, 40));
+}
+
+TEST_F(ViewContainerTest, AContainerTakenFromItsParentHidesAndShowsAgainUnderTheNext) {
+  auto first = MakeTopLevel(OS_Rect(0, 0, 200, 200));
+  auto second = MakeTopLevel(OS_Rect(300, 0, 200, 200));
+  OS_ViewContainerP container(new OS_ViewContainer(false));
+  container->UI_SetLocalRect(UI_Node::RectL(5, 5, 20, 20));
+  first->ChildPushBack(container);
+  container->UI_Show(true);
+  ASSERT_TRUE(container->UI_IsShown());
+  first->ChildRemove(container.get());
+  EXPECT_FALSE(container->UI_IsShown());
+  second->ChildPushBack(container);
+  EXPECT_TRUE(container->UI_IsShown());
+  EXPECT_EQ(mLayer.GetParent(container->GetHandle()), second->GetHandle());
+  EXPECT_EQ(mLayer.GetWindowRect(container->GetHandle()), OS_Rect(305, 5, 20, 20));
+}
+
+TEST_F(ViewContainerTest, AViewInANestedContainerReceivesClicksInItsOwnCoordinates) {
+  auto top = MakeTopLevel(OS_Rect(0, 0, 300, 300));
+  OS_ViewContainerP container(new OS_ViewContainer(false));
+  container->UI_SetLocalRect(UI_Node::RectL(100, 100, 100, 100));
+  top->ChildPushBack(container);
+  container->UI_Show(true);
+  auto view = AddView(container.get(), "inner", 10, 10, 50, 50);
+  mSystem.Click(OS_Point(120, 130));
+  mSystem.Pump();
+  ASSERT_FALSE(view->mouse.empty());
+  EXPECT_FLOAT_EQ(view->mouse[0].GetPosition().x, 10.0f);
+  EXPECT_FLOAT_EQ(view->mouse[0].GetPosition().y, 20.0f);
+}
+
+TEST_F(ViewContainerTest, APopupContainerPaintsThePanelBackgroundOrNothing) {
+  boost::intrusive_ptr<OS_PopupViewContainer> popup(new OS_PopupViewContainer(false, true));
+  popup->UI_SetLocalRect(UI_Node::RectL(0, 0, 40, 40));
+  popup->UI_Show(true);
+  popup->UI_Invalidate(nullptr, 0);
+  mSystem.Pump();
+  const drawbot::ColorRGBA expected = GetColor(277);
+  const HeadlessPixels pixels = mSystem.ReadWindowPixels(popup->GetHandle());
+  ASSERT_EQ(pixels.width, 40);
+  EXPECT_EQ(pixels.At(20, 20), Opaque(expected.red, expected.green, expected.blue));
+}
+
+TEST_F(ViewContainerTest, APopupWindowIsTopmostAndNeverActivates) {
+  OS_PopupWindow popup(nullptr);
+  const OS_WindowHandle handle = popup.GetHandle();
+  ASSERT_NE(handle, 0u);
+  EXPECT_NE(mLayer.GetExStyle(handle) & kOSExStyleTopmost, 0u);
+  EXPECT_NE(mLayer.GetExStyle(handle) & kOSExStyleNoActivate, 0u);
+  EXPECT_EQ(popup.UI_GetNodeID(), "OS_PopupWindow");
+}
+
+}  // namespace
+}  // namespace norvik::ui::test
+
+namespace norvik::ui::test {
+namespace {
+
+// Counts the context's life and the drawing steps, in order.
+class CountingGLView : public OS_OpenGLViewBase {
+ public:
+  void InitOpenGL() override { log.push_back("init"); }
+  void EndOpenGL() override { log.push_back("end"); }
+  void PreDrawOpenGL() override { log.push_back("pre"); }
+  void DrawOpenGL() override { log.push_back("draw"); }
+  void PostDrawOpenGL() override { log.push_back("post"); }
+  std::vector<std::string> log;
+};
+
+TEST_F(ViewContainerTest, TheGLContextIsRebuiltAcrossAReparentAndEndedWhenTakenAway) {
+  auto first = MakeTopLevel(OS_Rect(0, 0, 100, 100));
+  auto second = MakeTopLevel(OS_Rect(200, 0, 100, 100));
+  boost::intrusive_ptr<CountingGLView> gl(new CountingGLView);
+  first->ChildPushBack(gl);
+  EXPECT_THAT(gl->log, ::testing::ElementsAre("end", "init"));
+  gl->log.clear();
+  first->ChildRemove(gl.get());
+  second->ChildPushBack(gl);
+  EXPECT_THAT(gl->log, ::testing::ElementsAre("end", "end", "init"));
+}
+
+TEST_F(ViewContainerTest, AGLViewPaintMakesItsContextCurrentDrawsAndPresents) {
+  auto top = MakeTopLevel(OS_Rect(0, 0, 100, 100));
+  boost::intrusive_ptr<CountingGLView> gl(new CountingGLView);
+  gl->UI_SetLocalRect(UI_Node::RectL(0, 0, 50, 50));
+  top->ChildPushBack(gl);
+  gl->UI_Show(true);
+  gl->log.clear();
+  gl->UI_Invalidate(nullptr, 0);
+  mSystem.Pump();
+  EXPECT_THAT(gl->log, ::testing::ElementsAre("pre", "draw", "post"));
+}
+
+}  // namespace
+}  // namespace norvik::ui::test

@@ -1,0 +1,106 @@
+// Monitors: which screen a point or a rectangle belongs to, visibility, and
+// the monitors read from the native layer.
+#include <gtest/gtest.h>
+
+#include "tarsel/PropListUtils.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "utility/MonitorInfo.h"
+
+namespace norvik::utility {
+namespace {
+
+using Rect = MonitorInfo::Rect;
+using Point = MonitorInfo::Point;
+
+MonitorInfo TwoSideBySide() { return MonitorInfo({Rect(0, 0, 1000, 800), Rect(1000, 0, 1000, 800)}); }
+
+TEST(MonitorInfoTest, ARectangleEquallyOverTwoMonitorsBelongsToTheFirst) {
+  const MonitorInfo monitors = TwoSideBySide();
+  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(900, 100, 200, 100)), Rect(0, 0, 1000, 800));
+  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(901, 100, 200, 100)), Rect(1000, 0, 1000, 800));
+}
+
+TEST(MonitorInfoTest, WithOneMonitorARectangleFarOutsideStillGetsIt) {
+  const MonitorInfo monitors({Rect(0, 0, 1000, 800)});
+  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(50000, -90000, 10, 10)), Rect(0, 0, 1000, 800));
+}
+
+TEST(MonitorInfoTest, ARectangleOnNoMonitorGoesToTheNearest) {
+  const MonitorInfo monitors = TwoSideBySide();
+  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(2500, 100, 50, 50)), Rect(1000, 0, 1000, 800));
+  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(-900, 100, 50, 50)), Rect(0, 0, 1000, 800));
+}
+
+TEST(MonitorInfoTest, APointBelongsToTheMonitorHoldingItOrTheNearest) {
+  const MonitorInfo monitors = TwoSideBySide();
+  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(1000, 10)), Rect(1000, 0, 1000, 800));
+  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(999, 10)), Rect(0, 0, 1000, 800));
+  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(500, 5000)), Rect(0, 0, 1000, 800));
+}
+
+TEST(MonitorInfoTest, TheFurthestCornerCoversEveryMonitor) {
+  const MonitorInfo monitors({Rect(0, 0, 1000, 800), Rect(-500, 800, 600, 1200)});
+  EXPECT_EQ(monitors.GetMaxBottomRight(), Point(1000, 2000));
+}
+
+TEST(MonitorInfoTest, ARectangleOffEveryMonitorIsMovedOntoOneAndAVisibleOneStays) {
+  const MonitorInfo monitors = TwoSideBySide();
+  const Rect visible(100, 100, 300, 200);
+  EXPECT_TRUE(monitors.IsRectVisible(visible));
+  EXPECT_EQ(monitors.EnsureRectIsVisible(visible), visible);
+
+  const Rect lost(3000, 3000, 300, 200);
+  EXPECT_FALSE(monitors.IsRectVisible(lost));
+  const Rect placed = monitors.EnsureRectIsVisible(lost);
+  EXPECT_TRUE(monitors.IsRectVisible(placed));
+  EXPECT_EQ(placed.width, 300);
+  EXPECT_EQ(placed.height, 200);
+
+  // A title bar above the top of every screen cannot be taken hold of.
+  EXPECT_FALSE(monitors.IsRectVisible(Rect(100, -50, 300, 200)));
+  const Rect huge = monitors.EnsureRectIsVisible(Rect(-5000, -5000, 9000, 9000));
+  EXPECT_TRUE(monitors.IsRectVisible(huge));
+}
+
+TEST(MonitorInfoTest, SavedMonitorsReadBackAndCompare) {
+  const MonitorInfo a = TwoSideBySide();
+  const MonitorInfo b = TwoSideBySide();
+  const MonitorInfo c({Rect(0, 0, 1000, 800)});
+  EXPECT_TRUE(a.Equals(b));
+  EXPECT_FALSE(a.Equals(c));
+  tarsel::proplist::PropList list;
+  a.SaveToPropList(list);
+  std::int32_t count = 0;
+  ASSERT_TRUE(list.GetValue("MonitorCount", count));
+  EXPECT_EQ(count, 2);
+  Rect second;
+  ASSERT_TRUE(tarsel::proplist::utils::ReadRect32(list, "Monitor1", second));
+  EXPECT_EQ(second, Rect(1000, 0, 1000, 800));
+}
+
+TEST(MonitorInfoTest, TheNativeFormReadsTheWorkAreasOfTheLayerPrimaryFirst) {
+  ui::HeadlessWindowSystem system;
+  system.Install();
+  system.SetMonitors({{Rect(0, 0, 1920, 1080), Rect(0, 0, 1920, 1040)},
+                      {Rect(1920, 0, 1280, 1024), Rect(1920, 24, 1280, 1000)}});
+  OS_MonitorInfo monitors;
+  ASSERT_EQ(monitors.GetMonitorCount(), 2u);
+  Rect r;
+  ASSERT_TRUE(monitors.GetMonitorRect(0, r));
+  EXPECT_EQ(r, Rect(0, 0, 1920, 1040));
+  EXPECT_FALSE(monitors.GetMonitorRect(2, r));
+  EXPECT_EQ(monitors.GetMonitorIDFromRect(Rect(2000, 100, 100, 100)), 1u);
+
+  system.SetMonitors({{Rect(0, 0, 800, 600), Rect(0, 0, 800, 600)}});
+  monitors.Update();
+  EXPECT_EQ(monitors.GetMonitorCount(), 1u);
+}
+
+TEST(MonitorInfoTest, WithoutAPlatformOneMonitorCoversEverything) {
+  OS_MonitorInfo monitors;
+  ASSERT_EQ(monitors.GetMonitorCount(), 1u);
+  EXPECT_TRUE(monitors.IsRectVisible(Rect(123456, -654321, 100, 100)));
+}
+
+}  // namespace
+}  // namespace norvik::utility
