@@ -7,7 +7,12 @@
 // Input is injected at screen coordinates and queued as the desktop would
 // queue it; nothing is delivered until the queue is pumped (Pump, the loop,
 // or AdvanceClock, which pumps as it goes). The clock is virtual: it stands
-// still until AdvanceClock moves it.
+// still until AdvanceClock moves it, or until an idle loop jumps it to the
+// next timer.
+//
+// The system belongs to the UI thread. Other threads reach that thread
+// through the main thread's executor (tarsel/Threads.h), whose posts wake a
+// loop waiting in RunLoop; they never call the layer themselves.
 #include <cstdint>
 #include <memory>
 #include <string>

@@ -325,15 +325,23 @@ void OS_NativeLayer_Headless::RaiseOwnedAbove(OS_WindowHandle inOwner) {
 OS_WindowHandle OS_NativeLayer_Headless::ChildFromPoint(OS_WindowHandle inWindow, OS_Point inScreenPoint) const {
   const HeadlessWindow* window = Find(inWindow);
   if (!window) return 0;
-  for (OS_WindowHandle handle : window->children) {
-    const HeadlessWindow* child = Find(handle);
-    if (!child || (child->style & kOSStyleVisible) == 0 || (child->exStyle & kOSExStyleTransparent) != 0) continue;
-    if (!ScreenRectOf(*child).Contains(inScreenPoint)) continue;
+  // Walks down the children under the point, carrying the screen origin of
+  // the current window rather than recomputing it at every level.
+  OS_Point origin = ScreenRectOf(*window).Origin();
+  for (;;) {
+    const HeadlessWindow* hit = nullptr;
+    for (OS_WindowHandle handle : window->children) {
+      const HeadlessWindow* child = Find(handle);
+      if (!child || (child->style & kOSStyleVisible) == 0 || (child->exStyle & kOSExStyleTransparent) != 0) continue;
+      if (!child->rect.Offsetted(origin.x, origin.y).Contains(inScreenPoint)) continue;
+      hit = child;
+      break;
+    }
     // A disabled child lets the point fall to its parent.
-    if ((child->style & kOSStyleDisabled) != 0) return inWindow;
-    return ChildFromPoint(handle, inScreenPoint);
+    if (!hit || (hit->style & kOSStyleDisabled) != 0) return window->handle;
+    origin = OS_Point(origin.x + hit->rect.left, origin.y + hit->rect.top);
+    window = hit;
   }
-  return inWindow;
 }
 
 OS_WindowHandle OS_NativeLayer_Headless::WindowFromPoint(OS_Point inScreenPoint) const {
