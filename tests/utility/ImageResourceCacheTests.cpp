@@ -127,6 +127,17 @@ TEST_F(ImageCache, BytesThatAreNoPictureRaiseTheDecodersErrorAndCacheNothing) {
   EXPECT_EQ(mCache.GetSize(), 0u);
 }
 
+TEST_F(ImageCache, AMissingReaderOrSupplierRaisesTheAccessErrorOnAMiss) {
+  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(nullptr, mPlatform, "Gripper", kImageFileTypePNG); }),
+            "Unable to access resource.");
+  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, nullptr, "Gripper", kImageFileTypePNG); }),
+            "Unable to access resource.");
+  EXPECT_EQ(mCache.GetSize(), 0u);
+  // A hit needs neither: the stored image is answered as it is.
+  auto image = mCache.GetImage(&mLibrary, mPlatform, "Gripper", kImageFileTypePNG);
+  EXPECT_EQ(mCache.GetImage(nullptr, mPlatform, "Gripper", kImageFileTypePNG).get(), image.get());
+}
+
 TEST_F(ImageCache, ClearDropsEveryEntry) {
   mCache.GetImage(&mLibrary, mPlatform, "Gripper", kImageFileTypePNG);
   mCache.GetImage(&mLibrary, mRecording.get(), "Gripper", kImageFileTypePNG);
