@@ -17,13 +17,11 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   mTheme->NotifyThemeChanged();
 
   mHeader.reset(new HeaderView());
-  mHeader->UI_Show(true);
-  ChildPushBack(mHeader);
+  AddGalleryChild(this, mHeader);
   mSwitch.reset(new BrightnessSwitch());
   mSwitch->SetLight(mLight);
   mSwitch->SetChangeFunction([this](bool inLight) { SetLight(inLight); });
-  mSwitch->UI_Show(true);
-  ChildPushBack(mSwitch);
+  AddGalleryChild(this, mSwitch);
 
   const char* const titles[] = {"$$$/norvik/gallery/Section/Colours=Theme colours",
                                 "$$$/norvik/gallery/Section/Drawing=Drawing",
@@ -35,10 +33,8 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   for (std::size_t i = 0; i < mContents.size(); ++i) {
     boost::intrusive_ptr<SectionView> section(new SectionView(titles[i]));
     section->UI_SetNodeID(kSectionIDs[i]);
-    section->UI_Show(true);
-    ChildPushBack(section);
-    mContents[i]->UI_Show(true);
-    section->ChildPushBack(mContents[i]);
+    AddGalleryChild(this, section);
+    AddGalleryChild(section.get(), mContents[i]);
     mSections.push_back(section);
   }
 }
@@ -66,6 +62,10 @@ std::vector<ui::UI_Node*> GalleryPage::GetFocusTiles() const {
   std::vector<ui::UI_Node*> tiles;
   for (auto it = mFocusDemo->ChildBegin(); it != mFocusDemo->ChildEnd(); ++it) tiles.push_back(it->get());
   return tiles;
+}
+
+bool GalleryPage::UI_AreAllParentsVisible() const {
+  return UI_GetParentNode() ? UI_SubView::UI_AreAllParentsVisible() : UI_IsShown();
 }
 
 void GalleryPage::UI_Invalidate(const ui::UI_Node::RectL* inRect, unsigned long inFlags) {

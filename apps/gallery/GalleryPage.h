@@ -33,6 +33,8 @@ class GalleryPage : public ui::UI_SubView {
   std::vector<ui::UI_Node*> GetFocusTiles() const;
 
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+  // As the root of a window's contents, the page is visible when shown.
+  bool UI_AreAllParentsVisible() const override;
   void UI_Invalidate(const ui::UI_Node::RectL* inRect, unsigned long inFlags) override;
   void UI_SizeChanged(const RectF& inLocalRect) override;
 

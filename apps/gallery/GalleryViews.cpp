@@ -13,12 +13,13 @@ namespace {
 
 const unsigned short* U16(const UTF16String& inText) { return reinterpret_cast<const unsigned short*>(inText.c_str()); }
 
-void AddChild(ui::UI_Node* inParent, const ui::UI_NodeP& inChild) {
+}  // namespace
+
+void AddGalleryChild(ui::UI_Node* inParent, const ui::UI_NodeP& inChild) {
+  inChild->UI_SetIndex(static_cast<int>(inParent->ChildSize()));
   inChild->UI_Show(true);
   inParent->ChildPushBack(inChild);
 }
-
-}  // namespace
 
 // ---- SectionView ----
 
@@ -197,12 +198,12 @@ NodeTreeView::NodeTreeView() {
   for (int o = 0; o < 2; ++o) {
     ui::UI_NodeP outer(new HoverBoxView(outerKeys[o], 1));
     outer->UI_SetNodeID(o == 0 ? "sequence" : "mixer");
-    AddChild(this, outer);
+    AddGalleryChild(this, outer);
     mOuter.push_back(outer);
     mInner.emplace_back();
     for (int i = 0; i < 3; ++i) {
       ui::UI_NodeP inner(new HoverBoxView(innerKeys[o][i], 2));
-      AddChild(outer.get(), inner);
+      AddGalleryChild(outer.get(), inner);
       mInner.back().push_back(inner);
     }
   }
@@ -261,7 +262,7 @@ FocusDemoView::FocusDemoView() {
   static const char* const keys[kTileCount] = {
       "$$$/norvik/gallery/Focus/Source=Source", "$$$/norvik/gallery/Focus/Program=Program",
       "$$$/norvik/gallery/Focus/Timeline=Timeline", "$$$/norvik/gallery/Focus/Effects=Effects"};
-  for (const char* key : keys) AddChild(this, ui::UI_NodeP(new FocusTileView(key)));
+  for (const char* key : keys) AddGalleryChild(this, ui::UI_NodeP(new FocusTileView(key)));
 }
 
 void FocusDemoView::UI_SizeChanged(const RectF& inLocalRect) {

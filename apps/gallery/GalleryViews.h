@@ -11,6 +11,10 @@
 
 namespace norvik::gallery {
 
+// Shows inChild and appends it to inParent, numbering it with its place
+// among the children (the tab order walks children by that number).
+void AddGalleryChild(ui::UI_Node* inParent, const ui::UI_NodeP& inChild);
+
 // A titled panel: a rounded frame with a heading, holding one section.
 class SectionView : public ui::UI_SubView {
  public:

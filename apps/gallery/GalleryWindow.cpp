@@ -19,7 +19,9 @@ std::map<ui::OS_WindowHandle, GalleryWindow*>& Windows() {
   return sWindows;
 }
 
-constexpr int kVirtualKeyTab = 0x09;
+constexpr int kVirtualKeyShift = 0x10;
+constexpr int kVirtualKeyControl = 0x11;
+constexpr int kVirtualKeyAlt = 0x12;
 
 }  // namespace
 
@@ -96,6 +98,7 @@ std::intptr_t GalleryWindow::Handle(unsigned inMessage, std::uintptr_t inWParam,
     case ui::kOSMsgMouseMove:
     case ui::kOSMsgLeftButtonDown:
     case ui::kOSMsgLeftButtonUp:
+    case ui::kOSMsgLeftButtonDoubleClick:
     case ui::kOSMsgMouseLeave:
       MouseMessage(inMessage, inWParam, inLParam);
       return 0;
@@ -153,20 +156,39 @@ void GalleryWindow::MouseMessage(unsigned inMessage, std::uintptr_t, std::intptr
     mPage->UI_DispatchMouseEvent(ui::MouseEvent(ui::MouseEvent::kActionMove, 0, 0, point, {}, osEvent), false);
     return;
   }
-  const auto action =
-      inMessage == ui::kOSMsgLeftButtonDown ? ui::MouseEvent::kActionButtonDown : ui::MouseEvent::kActionButtonUp;
-  mPage->UI_DispatchMouseEvent(ui::MouseEvent(action, ui::MouseEvent::kButtonLeft, 1, point, {}, osEvent), false);
+  // A double click is a second press: views that count clicks see 2.
+  const bool up = inMessage == ui::kOSMsgLeftButtonUp;
+  const int clicks = inMessage == ui::kOSMsgLeftButtonDoubleClick ? 2 : 1;
+  mPage->UI_DispatchMouseEvent(ui::MouseEvent(up ? ui::MouseEvent::kActionButtonUp : ui::MouseEvent::kActionButtonDown,
+                                              ui::MouseEvent::kButtonLeft, clicks, point, {}, osEvent),
+                               false);
+}
+
+ui::ModifierKeys GalleryWindow::CurrentModifiers() const {
+  ui::ModifierKeys mods;
+  auto held = [this](int inKey) { return (mLayer.GetKeyState(inKey) & 0x8000) != 0; };
+  if (held(kVirtualKeyShift)) mods.Set(ui::kModKeyShift);
+  if (held(kVirtualKeyControl)) mods.Set(ui::kModKeyCtrl);
+  if (held(kVirtualKeyAlt)) mods.Set(ui::kModKeyAlt);
+  return mods;
 }
 
 void GalleryWindow::KeyMessage(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam) {
   ui::UI_NodeP keep(mPage);
-  const ui::KeyboardEvent event(ui::OS_Event(mHandle, inMessage, inWParam, inLParam));
+  // The key's code is the virtual key, negated for keys of the extended
+  // block (bit 24 of the second parameter).
+  const bool extended = (static_cast<std::uintptr_t>(inLParam) >> 24) & 1;
+  const short code = static_cast<short>(extended ? -static_cast<int>(inWParam) : static_cast<int>(inWParam));
+  const bool repeat = inMessage == ui::kOSMsgKeyDown && ((static_cast<std::uintptr_t>(inLParam) >> 30) & 1);
+  const ui::KeyboardEvent event(
+      inMessage == ui::kOSMsgKeyDown ? ui::KeyboardEvent::kActionKeyDown : ui::KeyboardEvent::kActionKeyUp, 0, code,
+      CurrentModifiers(), repeat, ui::OS_Event(mHandle, inMessage, inWParam, inLParam));
   ui::UI_Node* focus = ui::UI_Node::UI_GetKeyboardFocusLeafNode();
   if (focus && (focus == mPage.get() || focus->UI_IsChildOf(*mPage)) &&
       ui::UI_Node::UI_DispatchKeyboardEvent(focus, event))
     return;
-  if (inMessage == ui::kOSMsgKeyDown && static_cast<int>(inWParam) == kVirtualKeyTab)
-    ui::UI_Node::UI_DoAdvanceKeyboardFocus(mPage.get(), focus ? focus : mPage.get(), event);
+  // Nothing took the key: Tab and Shift+Tab move the focus through the page.
+  ui::UI_Node::UI_DoAdvanceKeyboardFocus(mPage.get(), focus ? focus : mPage.get(), event);
 }
 
 }  // namespace norvik::gallery

@@ -6,6 +6,7 @@
 #include <cstdint>
 
 #include "GalleryPage.h"
+#include "ui/ModifierKeys.h"
 #include "ui/OS_NativeLayer.h"
 
 namespace norvik::gallery {
@@ -34,6 +35,7 @@ class GalleryWindow {
   std::intptr_t Handle(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
   void Paint();
   void MouseMessage(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
+  ui::ModifierKeys CurrentModifiers() const;
   void KeyMessage(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
 
   ui::OS_NativeLayer& mLayer;
