@@ -95,6 +95,16 @@ TEST_F(ButtonKeyboardTest, FocusByMnemonicPressesTheButtonWithAFullTransaction) 
   EXPECT_THAT(log.entries, ElementsAre("changed", "begin", "continue", "finish"));
 }
 
+TEST_F(ButtonKeyboardTest, AListenerThatThrowsOnKeyUpReachesTheCallerAndTheChangeIsCancelled) {
+  log.Listen(*button);
+  button->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
+      [](UI_ControlChangedMessage*) { throw std::runtime_error("listener failed"); }));
+  KeyDown(button.get(), kSpace, ' ');
+  EXPECT_THROW(KeyUp(button.get(), kSpace, ' '), std::runtime_error);
+  EXPECT_FALSE(button->IsChangePending());
+  EXPECT_THAT(log.entries, ElementsAre("begin", "changed", "cancel"));
+}
+
 TEST_F(ButtonKeyboardTest, ModifierKeysSwapTheToolTip) {
   button->InsertModifiedToolTip(ModKeys(), u"Play");
   button->InsertModifiedToolTip(ModKeys(ui::kModKeyShift), u"Play backwards");

@@ -160,6 +160,19 @@ TEST_F(ButtonPressTest, AListenerThatThrowsReachesTheCallerAndLeavesTheChangeCan
   EXPECT_THAT(log.entries, ElementsAre("begin", "changed", "cancel"));
 }
 
+TEST_F(ButtonPressTest, EscapeDuringThePressCancelsAndRestoresTheLook) {
+  button->SetSpringLoaded(false);
+  log.Listen(*button);
+  Press(PointF(20, 20));
+  EXPECT_TRUE(button->GetDownState());
+  KeyDown(root.get(), 27, 27);
+  EXPECT_FALSE(button->GetDownState());
+  EXPECT_FALSE(button->IsButtonCaptured());
+  EXPECT_THAT(log.entries, ElementsAre("begin", "cancel"));
+  Release(PointF(20, 20));
+  EXPECT_THAT(log.entries, ElementsAre("begin", "cancel")) << "the release after a cancel does nothing";
+}
+
 TEST_F(ButtonPressTest, ARemovedButtonSurvivesItsOwnListenerDroppingIt) {
   button->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
       [this](UI_ControlChangedMessage*) { root->ChildRemove(button.get()); button.reset(); }));
