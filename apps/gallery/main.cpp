@@ -3,6 +3,7 @@
 // renders the page through the headless window system to a PNG and exits.
 #include <cstdio>
 #include <exception>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -12,6 +13,7 @@
 #include "tarsel/ThrowError.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/KeyframeThemeEditor.h"
+#include "ui/NativeLayerFactory.h"
 #include "ui/OS_NodeManager.h"
 #include "ui/Theme.h"
 
@@ -47,6 +49,20 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
   return result;
 }
 
+// Shows the page in a window on the display until the window is closed.
+int ShowOnDisplay(ui::OS_NativeLayer& inLayer, const gallery::GalleryOptions& inOptions,
+                  ui::KeyframeThemeEditorP inTheme) {
+  ui::InstallNativeLayer(&inLayer);
+  int result = gallery::kExitOK;
+  {
+    gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
+    gallery::GalleryWindow window(inLayer, page, inOptions.width, inOptions.height);
+    result = window.Run();
+  }
+  ui::InstallNativeLayer(nullptr);
+  return result;
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -66,6 +82,11 @@ int main(int argc, char** argv) {
     ui::Theme::Initialize(theme);
     std::string path = options.screenshot;
     if (path.empty()) {
+      if (std::unique_ptr<ui::OS_NativeLayer> display = ui::CreateX11NativeLayer()) {
+        const int result = ShowOnDisplay(*display, options, theme);
+        ui::Theme::Terminate();
+        return result;
+      }
       path = "norvik-gallery.png";
       std::printf("%s\n", Say("$$$/norvik/gallery/NoDisplay=No display to show a window on: rendering to ^0 instead.",
                               path)
