@@ -282,6 +282,15 @@ TEST_F(NativeWindowMessageTest, AnExceptionInAHandlerIsReportedAndDoesNotLeaveTh
   EXPECT_FALSE(reports.empty());
 }
 
+TEST_F(NativeWindowMessageTest, TheStructureRectangleIsTheWholeWindowOnTheScreen) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 100, 100));
+  window->UI_SetGlobalStructureRect(UI_Node::RectL(50, 60, 300, 200));
+  EXPECT_EQ(window->UI_GetGlobalStructureRect(), UI_Node::RectL(50, 60, 300, 200));
+  EXPECT_EQ(mLayer.GetWindowRect(window->GetHandle()), OS_Rect(50, 60, 300, 200));
+  window->UI_Move(UI_Node::PointL(70, 80));
+  EXPECT_EQ(window->UI_GetGlobalStructureRect(), UI_Node::RectL(70, 80, 300, 200));
+}
+
 TEST_F(NativeWindowMessageTest, LayeredOpacityIsAppliedAndOneRemovesIt) {
   auto window = MakeTopLevel(OS_Rect(0, 0, 100, 100));
   window->UI_SetOpacity(0.5f);
