@@ -1,5 +1,7 @@
 #include "GalleryPage.h"
 
+#include "ControlsView.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -7,7 +9,8 @@ namespace norvik::gallery {
 
 namespace {
 
-const char* const kSectionIDs[] = {"section-colours", "section-drawing", "section-tree", "section-focus"};
+const char* const kSectionIDs[] = {"section-colours", "section-drawing", "section-tree", "section-focus",
+                                   "section-controls"};
 
 }  // namespace
 
@@ -26,9 +29,11 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   const char* const titles[] = {"$$$/norvik/gallery/Section/Colours=Theme colours",
                                 "$$$/norvik/gallery/Section/Drawing=Drawing",
                                 "$$$/norvik/gallery/Section/Tree=Node tree and hover",
-                                "$$$/norvik/gallery/Section/Focus=Keyboard focus"};
+                                "$$$/norvik/gallery/Section/Focus=Keyboard focus",
+                                "$$$/norvik/gallery/Section/Controls=Controls"};
   mContents = {ui::UI_NodeP(new SwatchView()), ui::UI_NodeP(new DrawingSamplesView()),
-               ui::UI_NodeP(new NodeTreeView()), ui::UI_NodeP(new FocusDemoView())};
+               ui::UI_NodeP(new NodeTreeView()), ui::UI_NodeP(new FocusDemoView()),
+               ui::UI_NodeP(new ControlsView())};
   mFocusDemo = mContents[3];
   for (std::size_t i = 0; i < mContents.size(); ++i) {
     boost::intrusive_ptr<SectionView> section(new SectionView(titles[i]));
@@ -84,12 +89,19 @@ void GalleryPage::Arrange() {
   mSwitch->UI_SetLocalRectF(RectF(std::max(0.0f, r.width - kMargin - 140), (kHeaderHeight - 28) / 2, 140, 28));
   const float gap = 12;
   const float top = kHeaderHeight + kMargin;
-  const float w = std::max(0.0f, (r.width - 2 * kMargin - gap) / 2);
-  const float h = std::max(0.0f, (r.height - top - kMargin - gap) / 2);
+  const float w = std::floor(std::max(0.0f, (r.width - 2 * kMargin - gap) / 2));
+  const float avail = std::max(0.0f, r.height - top - kMargin - gap);
+  // The top row is as tall as the colours and drawing need; the bottom row
+  // takes the rest. On the right of it, focus above controls.
+  const float topH = std::floor(std::min(260.0f, avail / 2));
+  const float bottomH = std::floor(avail - topH);
+  const float focusH = std::floor(std::min(124.0f, std::max(0.0f, (bottomH - gap) / 2)));
+  const float left = kMargin, right = kMargin + w + gap, bottom = top + topH + gap;
+  const RectF frames[] = {RectF(left, top, w, topH), RectF(right, top, w, topH), RectF(left, bottom, w, bottomH),
+                          RectF(right, bottom, w, focusH),
+                          RectF(right, bottom + focusH + gap, w, std::max(0.0f, bottomH - focusH - gap))};
   for (std::size_t i = 0; i < mSections.size(); ++i) {
-    const float x = kMargin + static_cast<float>(i % 2) * (w + gap);
-    const float y = top + static_cast<float>(i / 2) * (h + gap);
-    mSections[i]->UI_SetLocalRectF(RectF(std::floor(x), std::floor(y), std::floor(w), std::floor(h)));
+    mSections[i]->UI_SetLocalRectF(frames[i]);
     mContents[i]->UI_SetLocalRectF(mSections[i]->ContentRect());
   }
 }
