@@ -1,0 +1,122 @@
+#include "controls/UI_PictureButton.h"
+
+#include <cmath>
+
+#include "drawbot/Drawbot.h"
+#include "tarsel/ThrowError.h"
+#include "ui/UI_NodeManager.h"
+
+namespace norvik::controls {
+
+namespace {
+constexpr std::uint64_t kDisabledImageAlphaColor = 306;
+
+class DrawButtonPicture : public DrawButtonFace {
+ public:
+  DrawButtonPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage, float inScale,
+                    float inAlpha)
+      : mParams(inParams), mImage(inImage), mScale(inScale), mAlpha(inAlpha) {}
+  void operator()(tarsel::utility::Flags<unsigned long>, const tarsel::geom::RectT<float>& inRect,
+                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme&,
+                  const ColorChangeMap*) const override {
+    const tarsel::geom::RectT<float> r(inRect.left + inOffset.x, inRect.top + inOffset.y, inRect.width,
+                                       inRect.height);
+    UI_PictureButton::DrawPicture(mParams, mImage, r, mScale, mAlpha, inDrawbot);
+  }
+
+ private:
+  const DrawParameters& mParams;
+  const drawbot::ImageInterface& mImage;
+  float mScale, mAlpha;
+};
+}  // namespace
+
+UI_PictureButton::UI_PictureButton() { UI_SetNodeID("UI_PictureButton"); }
+
+void UI_PictureButton::SetImageBaseName(const UTF8String& inName) {
+  if (mImageBaseName == inName) return;
+  mImageBaseName = inName;
+  UI_Invalidate(nullptr, 0);
+}
+
+void UI_PictureButton::SetImageSupplyFunction(const ImageSupplyFunction& inFunction) {
+  mSupply = inFunction;
+  UI_Invalidate(nullptr, 0);
+}
+
+void UI_PictureButton::SetScale(float inScale) {
+  if (mScale == inScale) return;
+  mScale = inScale;
+  UI_Invalidate(nullptr, 0);
+}
+
+void UI_PictureButton::SetAlpha(float inAlpha) {
+  if (mAlpha == inAlpha) return;
+  mAlpha = inAlpha;
+  UI_Invalidate(nullptr, 0);
+}
+
+const drawbot::ImageInterface* UI_PictureButton::GetImage() const {
+  if (!mSupply) return nullptr;
+  UI_PictureSupplyMessage message(this, GetCurrentModKeys());
+  message.SetStateFlags(GetControlState(true));
+  mSupply(&message);
+  return message.GetImage();
+}
+
+// A name that the resources do not hold draws no picture rather than failing
+// the whole paint.
+const drawbot::ImageInterface* UI_PictureButton::FindImage(const drawbot::SupplierInterface* inSupplier) const {
+  if (mSupply) return GetImage();
+  const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
+  if (mImageBaseName.empty() || !manager || !manager->GetDrawbotImageResourceCache() || !inSupplier) return nullptr;
+  try {
+    return manager->GetDrawbotImageResourceCache()
+        ->GetImage(&manager->GetResourceManager(), inSupplier, mImageBaseName, drawbot::kImageFileTypePNG)
+        .get();
+  } catch (const tarsel::config::Exception&) {
+    return nullptr;
+  }
+}
+
+void UI_PictureButton::DrawPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage,
+                                   const RectF& inRect, float inScale, float inAlpha, drawbot::Drawbot& inDrawbot) {
+  const float width = static_cast<float>(inImage.GetWidth()) * inScale;
+  const float height = static_cast<float>(inImage.GetHeight()) * inScale;
+  if (width < 0.01f || height < 0.01f || !inDrawbot.GetSurface() || !inDrawbot.GetSupplier()) return;
+  float alpha = inAlpha;
+  if (inParams.GetControlState().Test(UI_ControlView::kStateDisabled))
+    alpha *= inParams.Color(kDisabledImageAlphaColor).alpha;
+  const float left = std::trunc(inRect.left + (inRect.width - width) / 2);
+  const float top = std::trunc(inRect.top + (inRect.height - height) / 2);
+  inDrawbot.GetSurface()->DrawImage(*inDrawbot.GetSupplier(), inImage, RectF(left, top, width, height), nullptr,
+                                    alpha);
+}
+
+void UI_PictureButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
+  DrawButtonParameters params(this);
+  FillButtonParameters(params);
+  const auto state = params.GetControlState();
+  const bool border = ShouldDisplayBorderAlways() ||
+                      (!ShouldDisplayBorderNever() && state != DrawParameters::StateFlags() &&
+                       state != DrawParameters::StateFlags(kStateDisabled));
+  params.SetDrawOutline(border);
+  params.SetDrawContainer(ShouldDisplayContainerAlways() || (border && !ShouldDisplayContainerNever()));
+  if (GetDownState()) params.SetOffset(params.GetOffset() + GetDownOffset());
+  const drawbot::ImageInterface* image = FindImage(inDrawbot->GetSupplier());
+  if (!image) {
+    Draw(params, *inDrawbot);
+    return;
+  }
+  const DrawButtonPicture face(params, *image, mScale, mAlpha);
+  params.SetDrawButtonFace(&face);
+  Draw(params, *inDrawbot);
+}
+
+UI_OwnerDrawButton::UI_OwnerDrawButton() { UI_SetNodeID("UI_OwnerDrawButton"); }
+
+void UI_OwnerDrawButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
+  if (mDraw && inDrawbot) mDraw(*this, *inDrawbot);
+}
+
+}  // namespace norvik::controls

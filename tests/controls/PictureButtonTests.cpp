@@ -1,0 +1,76 @@
+// Picture buttons ask their supply function for the image of their state,
+// centre it on whole pixels and fade it when disabled; owner-drawn buttons
+// leave all painting to their owner.
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "controls/UI_PictureButton.h"
+#include "drawbot/Drawbot.h"
+#include "drawbot/DrawbotWrappers.h"
+#include "support/controls/ControlTestSupport.h"
+#include "support/drawbot/PixelCompare.h"
+
+namespace norvik::controls::test {
+namespace {
+
+using drawbot::testing::PixelCanvas;
+
+class PictureButtonTest : public ControlTest {
+ protected:
+  PictureButtonTest() : canvas(40, 30), pixels(16, 0xFFFF0000u) {
+    image = drawbot::BufferImageP(canvas.GetSupplier(), 4, 4, 16, drawbot::kPixelLayoutBGRAPremul, pixels.data(),
+                                  nullptr);
+  }
+  PixelCanvas canvas;
+  std::vector<std::uint32_t> pixels;
+  drawbot::BufferImageP image;
+};
+
+TEST_F(PictureButtonTest, TheSupplyFunctionSeesTheStateAndAnswersTheImage) {
+  auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
+  DrawParameters::StateFlags seen;
+  button->SetImageSupplyFunction([&](UI_PictureSupplyMessage* inMessage) {
+    seen = inMessage->GetStateFlags();
+    EXPECT_EQ(inMessage->GetControl(), button.get());
+    inMessage->SetImage(image.Get());
+  });
+  button->SetDownState(true);
+  EXPECT_EQ(button->GetImage(), image.Get());
+  EXPECT_TRUE(seen.Test(UI_ControlView::kStateDown));
+}
+
+TEST_F(PictureButtonTest, WithoutASupplyFunctionThereIsNoImage) {
+  auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
+  EXPECT_EQ(button->GetImage(), nullptr);
+}
+
+TEST_F(PictureButtonTest, ThePictureIsCentredOnWholePixels) {
+  canvas.Clear(0xFFFFFF);
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  DrawParameters params;
+  UI_PictureButton::DrawPicture(params, *image, RectF(0, 0, 11, 11), 1, 1, drawbot);
+  const auto snapshot = canvas.Snapshot();
+  // 11 - 4 = 7, halved to 3.5 and truncated to 3: the image covers 3 to 6.
+  EXPECT_EQ(snapshot.At(3, 3), 0xFFFF0000u);
+  EXPECT_EQ(snapshot.At(6, 6), 0xFFFF0000u);
+  EXPECT_EQ(snapshot.At(2, 2), 0xFFFFFFFFu);
+  EXPECT_EQ(snapshot.At(7, 7), 0xFFFFFFFFu);
+}
+
+TEST_F(PictureButtonTest, AnOwnerDrawnButtonPaintsOnlyThroughItsFunction) {
+  auto button = Add(new UI_OwnerDrawButton, RectF(0, 0, 20, 20));
+  int calls = 0;
+  button->SetOwnerDrawFunction([&](UI_OwnerDrawButton& inButton, drawbot::Drawbot&) {
+    EXPECT_EQ(&inButton, button.get());
+    ++calls;
+  });
+  canvas.Clear(0xFFFFFF);
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  button->UI_Draw(&drawbot);
+  EXPECT_EQ(calls, 1);
+  EXPECT_EQ(canvas.Snapshot().At(5, 5), 0xFFFFFFFFu) << "nothing else painted";
+}
+
+}  // namespace
+}  // namespace norvik::controls::test
