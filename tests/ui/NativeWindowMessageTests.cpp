@@ -291,6 +291,19 @@ TEST_F(NativeWindowMessageTest, TheStructureRectangleIsTheWholeWindowOnTheScreen
   EXPECT_EQ(window->UI_GetGlobalStructureRect(), UI_Node::RectL(70, 80, 300, 200));
 }
 
+TEST_F(NativeWindowMessageTest, WhileMouseActivationIsSuspendedAClickBringsTheSuspendingWindowForward) {
+  auto popup = MakeTopLevel(OS_Rect(0, 0, 100, 100));
+  auto other = MakeTopLevel(OS_Rect(200, 0, 100, 100));
+  UI_NodeManager::SuspendOSMouseActivates suspend(&mManager, reinterpret_cast<void*>(popup->GetHandle()));
+  mSystem.DeactivateApplication();
+  mManager.SetApplicationFrontmost(false);
+  const std::intptr_t result = mLayer.SendMessage(other->GetHandle(), kOSMsgMouseActivate, other->GetHandle(), 0);
+  EXPECT_EQ(result, kOSMouseNoActivateAndEat);
+  EXPECT_EQ(mLayer.GetForegroundWindow(), popup->GetHandle());
+  // Once the click's own window is in front, the click goes through as it is.
+  EXPECT_EQ(mLayer.SendMessage(popup->GetHandle(), kOSMsgMouseActivate, popup->GetHandle(), 0), 0);
+}
+
 TEST_F(NativeWindowMessageTest, LayeredOpacityIsAppliedAndOneRemovesIt) {
   auto window = MakeTopLevel(OS_Rect(0, 0, 100, 100));
   window->UI_SetOpacity(0.5f);
