@@ -138,7 +138,6 @@ class OS_Window : public UI_Node, public UI_Window {
   int UI_GetClickCount(int inGivenCount, int inAction, int inButtons, const PointF& inPosition);
   // The keyboard event of a key or character message.
   KeyboardEvent UI_GetKeyboardEventFromOSEvent(const OS_Event& inEvent) const;
-  bool UI_GetDoubleBufferedPaint() const { return false; }
 
   // Raises the structure-rectangle depth for its lifetime, with the
   // rectangle being set; the old values come back at the end.
