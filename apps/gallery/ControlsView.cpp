@@ -27,6 +27,11 @@ ControlsView::ControlsView() {
     mRadios.push_back(radio);
   }
   for (const ui::UI_NodeP& n : {mRender, mExport, mSnap, mWaveforms, mGroup}) AddGalleryChild(this, n);
+  // Every control takes focus from a click and from Tab, like the tiles
+  // above them.
+  for (const ui::UI_NodeP& n : {mRender, mExport, mSnap, mWaveforms})
+    static_cast<controls::UI_ControlView*>(n.get())->SetWantsKeyboardFocus(true);
+  for (const ui::UI_NodeP& radio : mRadios) static_cast<controls::UI_ControlView*>(radio.get())->SetWantsKeyboardFocus(true);
   group->SetIndex(0);
 }
 

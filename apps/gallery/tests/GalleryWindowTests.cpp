@@ -5,7 +5,11 @@
 
 #include <gtest/gtest.h>
 
+#include "ControlsView.h"
 #include "GalleryPage.h"
+#include "controls/UI_Checkbox.h"
+#include "controls/UI_RadioButton.h"
+#include "controls/UI_RadioGroup.h"
 #include "GalleryWindow.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_Event.h"
@@ -175,13 +179,36 @@ TEST_F(GalleryWindowTest, ClickingATileFocusesItAndDrawsTheRingAroundIt) {
   EXPECT_EQ(Pixels().At(ringX, ringY), before) << "the ring leaves with the focus";
 }
 
+TEST_F(GalleryWindowTest, TheControlsTakeClicksThroughTheWindow) {
+  Open(false, 1120, 720);  // the program's default size, where every control is in view
+  auto* view = static_cast<ControlsView*>(page->GetSection("section-controls")->UI_ChildGetFromID("controls"));
+  ASSERT_NE(view, nullptr);
+  controls::UI_Checkbox* snap = view->GetSnapCheckbox();
+  ASSERT_TRUE(snap->IsChecked());
+  Click(snap);
+  EXPECT_FALSE(snap->IsChecked());
+  system.AdvanceClock(1000);  // past the double-click time, so the next click is a single one
+  Click(snap);
+  EXPECT_TRUE(snap->IsChecked());
+  controls::UI_RadioGroup* group = view->GetTimeDisplayGroup();
+  EXPECT_EQ(group->GetIndex(), 0);
+  ui::UI_Node* samples = (group->ChildBegin() + 2)->get();
+  system.AdvanceClock(1000);
+  // On the round button at the left end of the radio.
+  const ui::UI_Node::RectL onPage = samples->UI_LocalToGlobal(ui::UI_Node::RectL(6, 9, 1, 1));
+  system.Click(system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(onPage.left, onPage.top)));
+  system.AdvanceClock(100);
+  EXPECT_EQ(group->GetIndex(), 2);
+  EXPECT_EQ(group->GetSelectedRadioButton(), samples);
+}
+
 TEST_F(GalleryWindowTest, ResizingTheWindowLaysTheSectionsOutInTheNewSize) {
   Open(false, 900, 600);
   system.GetLayer().SetWindowPos(window->GetHandle(), ui::kOSInsertTop, ui::OS_Rect(60, 60, 1300, 900), 0);
   system.Pump();
   EXPECT_EQ(page->UI_GetLocalRectF(false).width, 1300);
   EXPECT_EQ(page->UI_GetLocalRectF(false).height, 900);
-  for (const char* id : {"section-colours", "section-drawing", "section-tree", "section-focus"}) {
+  for (const char* id : {"section-colours", "section-drawing", "section-tree", "section-focus", "section-controls"}) {
     SectionView* s = page->GetSection(id);
     ASSERT_NE(s, nullptr) << id;
     const RectF r = s->UI_GetLocalRectF(true);
@@ -211,7 +238,7 @@ TEST_F(GalleryWindowTest, ClosingTheWindowEndsTheLoopAndTheWindowIsGone) {
 
 TEST_F(GalleryWindowTest, EverySectionHasATitleAndContentInsideIt) {
   Open(false);
-  for (const char* id : {"section-colours", "section-drawing", "section-tree", "section-focus"}) {
+  for (const char* id : {"section-colours", "section-drawing", "section-tree", "section-focus", "section-controls"}) {
     SectionView* s = page->GetSection(id);
     ASSERT_NE(s, nullptr) << id;
     EXPECT_FALSE(s->Title().empty()) << id;
