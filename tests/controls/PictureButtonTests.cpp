@@ -1,10 +1,12 @@
 // Picture buttons ask their supply function for the image of their state,
 // centre it on whole pixels and fade it when disabled; owner-drawn buttons
-// leave all painting to their owner.
+// leave all painting to their owner; lock and link buttons pick their images
+// by state and draw a glyph where the image is missing.
 #include <vector>
 
 #include <gtest/gtest.h>
 
+#include "controls/UI_LockButton.h"
 #include "controls/UI_PictureButton.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
@@ -70,6 +72,31 @@ TEST_F(PictureButtonTest, AnOwnerDrawnButtonPaintsOnlyThroughItsFunction) {
   button->UI_Draw(&drawbot);
   EXPECT_EQ(calls, 1);
   EXPECT_EQ(canvas.Snapshot().At(5, 5), 0xFFFFFFFFu) << "nothing else painted";
+}
+
+
+TEST(LockAndLinkImageNames, FollowTheStateRolloverAndIconType) {
+  EXPECT_EQ(UI_LockButton::ImageName(true, false, 0), UTF8String("RV4_Locked_Sm_N"));
+  EXPECT_EQ(UI_LockButton::ImageName(false, true, 0), UTF8String("RV4_Unlocked_Sm_R"));
+  EXPECT_EQ(UI_LockButton::ImageName(true, true, 1), UTF8String("RV4_Locked_Sm_R_D"));
+  EXPECT_EQ(UI_LinkButton::ImageName(true, 0), UTF8String("RV4_ConstrainedProportions"));
+  EXPECT_EQ(UI_LinkButton::ImageName(false, 1), UTF8String("RV4_UnconstrainedProportions_D"));
+}
+
+TEST_F(PictureButtonTest, ALockButtonTogglesAndPaintsAGlyphWhenItsImageIsMissing) {
+  auto lock = Add(new UI_LockButton, RectF(0, 0, 20, 20));
+  Press(PointF(5, 5));
+  Release(PointF(5, 5));
+  EXPECT_EQ(lock->GetValue(), UI_Button::kButtonOn);
+  EXPECT_EQ(lock->GetImage(), nullptr) << "no image cache in this test";
+  canvas.Clear(0xFFFFFF);
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  lock->UI_Draw(&drawbot);
+  const auto snapshot = canvas.Snapshot();
+  int painted = 0;
+  for (int y = 0; y < 20; ++y)
+    for (int x = 0; x < 20; ++x) painted += snapshot.At(x, y) != 0xFFFFFFFFu ? 1 : 0;
+  EXPECT_GT(painted, 10) << "the vector lock stands in for the image";
 }
 
 }  // namespace
