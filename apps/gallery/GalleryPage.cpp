@@ -93,7 +93,7 @@ void GalleryPage::Arrange() {
   const float avail = std::max(0.0f, r.height - top - kMargin - gap);
   // The top row is as tall as the colours and drawing need; the bottom row
   // takes the rest. On the right of it, focus above controls.
-  const float topH = std::floor(std::min(260.0f, avail / 2));
+  const float topH = std::floor(std::min(220.0f, avail / 2));
   const float bottomH = std::floor(avail - topH);
   const float focusH = std::floor(std::min(124.0f, std::max(0.0f, (bottomH - gap) / 2)));
   const float left = kMargin, right = kMargin + w + gap, bottom = top + topH + gap;

@@ -249,6 +249,20 @@ TEST_F(GalleryWindowTest, EverySectionHasATitleAndContentInsideIt) {
     EXPECT_LE(content.top + content.height, frame.height) << id;
   }
   EXPECT_EQ(page->GetSection("no-such-section"), nullptr);
+  // Nothing inside a section's content hangs out of it (where it could be
+  // seen but not clicked).
+  for (const char* id : {"section-focus", "section-controls"}) {
+    ui::UI_Node* content = page->GetSection(id)->ChildBegin()->get();
+    const RectF bounds = content->UI_GetLocalRectF(false);
+    for (auto it = content->ChildBegin(); it != content->ChildEnd(); ++it) {
+      const RectF r = (*it)->UI_GetLocalRectF(true);
+      EXPECT_LE(r.top + r.height, bounds.height) << id << " child " << (it - content->ChildBegin());
+      for (auto inner = (*it)->ChildBegin(); inner != (*it)->ChildEnd(); ++inner) {
+        const RectF ir = (*inner)->UI_GetLocalRectF(true);
+        EXPECT_LE(r.top + ir.top + ir.height, bounds.height) << id << " grandchild";
+      }
+    }
+  }
 }
 
 }  // namespace
