@@ -23,15 +23,16 @@ drawbot::ColorRGBA Mid(const drawbot::ColorRGBA& inA, const drawbot::ColorRGBA& 
                             (inA.alpha + inB.alpha) / 2);
 }
 
-// The four colour pairs of the rings, outermost first, by state.
+// The four colour pairs of the rings, outermost first, by state. Each state's
+// set follows the last: the outer colour 2 further on, the inner three 8.
 void RingColors(const DrawParameters& inParams, std::uint64_t (&outColors)[4][2]) {
   const auto state = inParams.GetControlState();
   std::uint64_t set[4] = {49, 77, 78, 79};
   if (state.Test(UI_ControlView::kStateDisabled)) {
-    const std::uint64_t disabled[4] = {57, 93, 94, 95};
+    const std::uint64_t disabled[4] = {55, 101, 102, 103};
     std::copy(disabled, disabled + 4, set);
   } else if (state.Test(UI_ControlView::kStateDown)) {
-    const std::uint64_t down[4] = {53, 89, 90, 91};
+    const std::uint64_t down[4] = {53, 93, 94, 95};
     std::copy(down, down + 4, set);
   } else if (state.Test(UI_ControlView::kStateRollover)) {
     const std::uint64_t rollover[4] = {51, 85, 86, 87};
