@@ -14,7 +14,7 @@ namespace {
 
 // The gallery's windows by handle. A window procedure is shared by all the
 // windows of a layer, so it finds its object here.
-std::map<ui::OS_WindowHandle, GalleryWindow*>& Windows() {
+std::map<ui::OS_WindowHandle, GalleryWindow*>& OpenGalleryWindows() {
   static std::map<ui::OS_WindowHandle, GalleryWindow*> sWindows;
   return sWindows;
 }
@@ -56,8 +56,8 @@ GalleryWindow::~GalleryWindow() {
   if (mHandle) mLayer.DestroyWindow(mHandle);
   // A window destroyed by the platform before this point has already left
   // the table in its destroy message.
-  for (auto it = Windows().begin(); it != Windows().end();)
-    it = it->second == this ? Windows().erase(it) : std::next(it);
+  for (auto it = OpenGalleryWindows().begin(); it != OpenGalleryWindows().end();)
+    it = it->second == this ? OpenGalleryWindows().erase(it) : std::next(it);
 }
 
 void GalleryWindow::Update() {
@@ -71,10 +71,10 @@ std::intptr_t GalleryWindow::Procedure(ui::OS_WindowHandle inWindow, unsigned in
   if (inMessage == ui::kOSMsgNCCreate && inLParam != 0) {
     auto* self = reinterpret_cast<GalleryWindow*>(inLParam);
     self->mHandle = inWindow;
-    Windows()[inWindow] = self;
+    OpenGalleryWindows()[inWindow] = self;
   }
-  auto it = Windows().find(inWindow);
-  if (it == Windows().end()) {
+  auto it = OpenGalleryWindows().find(inWindow);
+  if (it == OpenGalleryWindows().end()) {
     ui::OS_NativeLayer* layer = ui::GetNativeLayer();
     return layer ? layer->DefaultWindowProcedure(inWindow, inMessage, inWParam, inLParam) : 0;
   }
@@ -113,7 +113,7 @@ std::intptr_t GalleryWindow::Handle(unsigned inMessage, std::uintptr_t inWParam,
       mLayer.QuitLoop(0);
       return 0;
     case ui::kOSMsgNCDestroy:
-      Windows().erase(handle);
+      OpenGalleryWindows().erase(handle);
       mHandle = 0;
       return 0;
     default:
