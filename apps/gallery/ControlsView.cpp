@@ -7,6 +7,7 @@
 #include "controls/UI_RadioButton.h"
 #include "controls/UI_RadioGroup.h"
 #include "controls/UI_TextButton.h"
+#include "ui/MessageT.h"
 
 namespace norvik::gallery {
 
@@ -33,6 +34,31 @@ ControlsView::ControlsView() {
     static_cast<controls::UI_ControlView*>(n.get())->SetWantsKeyboardFocus(true);
   for (const ui::UI_NodeP& radio : mRadios) static_cast<controls::UI_ControlView*>(radio.get())->SetWantsKeyboardFocus(true);
   group->SetIndex(0);
+
+  mStatus = Text("$$$/norvik/gallery/Controls/Hint=Press a button: its name shows here.");
+  const std::pair<ui::UI_NodeP, const char*> buttons[] = {
+      {mRender, "$$$/norvik/gallery/Controls/Rendered=Pressed: Render"},
+      {mExport, "$$$/norvik/gallery/Controls/Exported=Pressed: Export..."}};
+  for (const auto& [button, key] : buttons) {
+    const std::string statusKey(key);
+    static_cast<controls::UI_ControlView*>(button.get())
+        ->NotifyWhenChanged(ui::MakeNotification<void(controls::UI_ControlChangedMessage*)>(
+            [this, statusKey](controls::UI_ControlChangedMessage*) {
+              mStatus = Text(statusKey);
+              UI_Invalidate(nullptr, 0);
+            }));
+  }
+}
+
+controls::UI_TextButton* ControlsView::GetRenderButton() const {
+  return static_cast<controls::UI_TextButton*>(mRender.get());
+}
+
+void ControlsView::UI_Draw(drawbot::Drawbot* inDrawbot) {
+  const GalleryColors c = CurrentColors();
+  const RectF r = UI_GetLocalRectF(false);
+  DrawLabel(inDrawbot, mStatus, RectF(0, std::min(r.height - 18, 24.0f + 8 + 3 * 22 + 12), r.width, 18), c.dimText);
+  UI_SubView::UI_Draw(inDrawbot);
 }
 
 controls::UI_Checkbox* ControlsView::GetSnapCheckbox() const {

@@ -19,13 +19,18 @@ class ControlsView : public ui::UI_SubView {
   ControlsView();
   void UI_SizeChanged(const RectF& inLocalRect) override;
 
+  void UI_Draw(drawbot::Drawbot* inDrawbot) override;
   controls::UI_Checkbox* GetSnapCheckbox() const;
+  controls::UI_TextButton* GetRenderButton() const;
+  // The line under the controls: the last button pressed, or a hint.
+  const UTF16String& GetStatus() const { return mStatus; }
   controls::UI_RadioGroup* GetTimeDisplayGroup() const;
 
  private:
   void Arrange();
   ui::UI_NodeP mRender, mExport, mSnap, mWaveforms, mGroup;
   std::vector<ui::UI_NodeP> mRadios;
+  UTF16String mStatus;
 };
 
 }  // namespace norvik::gallery

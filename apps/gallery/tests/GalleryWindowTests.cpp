@@ -10,6 +10,7 @@
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_RadioButton.h"
 #include "controls/UI_RadioGroup.h"
+#include "controls/UI_TextButton.h"
 #include "GalleryWindow.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_Event.h"
@@ -200,6 +201,12 @@ TEST_F(GalleryWindowTest, TheControlsTakeClicksThroughTheWindow) {
   system.AdvanceClock(100);
   EXPECT_EQ(group->GetIndex(), 2);
   EXPECT_EQ(group->GetSelectedRadioButton(), samples);
+  // A push button reports itself on the status line.
+  const UTF16String hint = view->GetStatus();
+  system.AdvanceClock(1000);
+  Click(view->GetRenderButton());
+  EXPECT_NE(view->GetStatus(), hint);
+  EXPECT_NE(view->GetStatus().find(u"Render"), UTF16String::npos);
 }
 
 TEST_F(GalleryWindowTest, ResizingTheWindowLaysTheSectionsOutInTheNewSize) {
