@@ -60,6 +60,17 @@ TEST_F(X11Windows, CreationSendsCreateThenSizeAndDestructionSendsDestroyMessages
   EXPECT_FALSE(mLayer->IsWindow(window));
 }
 
+TEST_F(X11Windows, AWindowDestroyedByAnotherClientHearsItAndIsForgotten) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 80, 60), 0x556677);
+  mMessages.clear();
+  xcb_destroy_window(mUser, static_cast<xcb_window_t>(window));
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return !mLayer->IsWindow(window); }));
+  EXPECT_TRUE(Received(kOSMsgDestroy));
+  EXPECT_TRUE(Received(kOSMsgNCDestroy));
+  EXPECT_EQ(mLayer->GetActiveWindow(), 0u);
+}
+
 TEST_F(X11Windows, AWindowRefusingCreationIsNotMade) {
   mHandler = [](const RecordedMessage& m) { return m.message == kOSMsgNCCreate; };  // answers 0
   OS_WindowCreateParams params;

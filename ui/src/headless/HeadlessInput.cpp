@@ -4,6 +4,7 @@
 // focus window), with double clicks, click activation and key parameters.
 #include <cstdlib>
 
+#include "ui/OS_DefaultWindowProcedure.h"
 #include "ui/src/headless/OS_NativeLayer_Headless.h"
 
 namespace norvik::ui::headless {
@@ -12,8 +13,6 @@ namespace {
 constexpr int kButtonLeft = 1;
 constexpr int kButtonMiddle = 2;
 constexpr int kButtonRight = 4;
-constexpr int kHitClient = 1;  // the hit-test code of a client area
-constexpr int kKeyF4 = 115;
 constexpr int kKeyF10 = 121;
 
 int ButtonKey(int inButton) {
@@ -224,7 +223,7 @@ bool OS_NativeLayer_Headless::HandleClickActivation(const QueuedMessage& inMessa
   const HeadlessWindow* top = Find(topLevel);
   if (!top || topLevel == mActive || (top->exStyle & kOSExStyleNoActivate) != 0) return true;
   const std::intptr_t answer = CallProcedure(target, kOSMsgMouseActivate, topLevel,
-                                             static_cast<std::intptr_t>(MakeWParam(kHitClient, inMessage.event.GetMsg())));
+                                             static_cast<std::intptr_t>(MakeWParam(kOSHitClient, inMessage.event.GetMsg())));
   if (!Find(target)) return false;
   if (answer != kOSMouseNoActivate && answer != kOSMouseNoActivateAndEat && CanActivate(topLevel))
     Activate(topLevel, kOSActivationClickActive);
@@ -233,56 +232,12 @@ bool OS_NativeLayer_Headless::HandleClickActivation(const QueuedMessage& inMessa
 
 void OS_NativeLayer_Headless::SendSetCursor(OS_WindowHandle inWindow, unsigned inMouseMessage) {
   CallProcedure(inWindow, kOSMsgSetCursor, inWindow,
-                static_cast<std::intptr_t>(MakeWParam(kHitClient, inMouseMessage)));
+                static_cast<std::intptr_t>(MakeWParam(kOSHitClient, inMouseMessage)));
 }
 
 std::intptr_t OS_NativeLayer_Headless::DefaultWindowProcedure(OS_WindowHandle inWindow, unsigned inMessage,
                                                               std::uintptr_t inWParam, std::intptr_t inLParam) {
-  const HeadlessWindow* window = Find(inWindow);
-  if (!window) return 0;
-  const OS_WindowHandle parent = window->parent;
-  switch (inMessage) {
-    case kOSMsgNCCreate:
-      return 1;
-    case kOSMsgClose:
-      DestroyWindow(inWindow);
-      return 0;
-    case kOSMsgActivate:
-      if (LowWord(inWParam) != kOSActivationInactive && HighWord(inWParam) == 0) SetFocus(inWindow);
-      return 0;
-    case kOSMsgSetCursor:
-      if (parent != 0)
-        if (std::intptr_t handled = SendMessage(parent, inMessage, inWParam, inLParam)) return handled;
-      if (LowWord(static_cast<std::uintptr_t>(inLParam)) == kHitClient) SetCursor(LoadSystemCursor(kOSCursorArrow));
-      return 0;
-    case kOSMsgMouseActivate:
-      if (parent != 0)
-        if (std::intptr_t answer = SendMessage(parent, inMessage, inWParam, inLParam)) return answer;
-      return kOSMouseActivate;
-    case kOSMsgPaint: {
-      const OS_PaintContext context = BeginPaint(inWindow);
-      EndPaint(inWindow, context);
-      return 0;
-    }
-    case kOSMsgMouseWheel:
-    case kOSMsgMouseHorizontalWheel:
-      return parent != 0 ? SendMessage(parent, inMessage, inWParam, inLParam) : 0;
-    case kOSMsgSysKeyDown:
-      if (inWParam == static_cast<std::uintptr_t>(kKeyF4) && (inLParam & (std::intptr_t(1) << 29)) != 0)
-        SendMessage(TopLevelOf(inWindow), kOSMsgSysCommand, kOSSysCommandClose, 0);
-      return 0;
-    case kOSMsgSysCommand:
-      switch (inWParam & ~std::uintptr_t(0xF)) {
-        case kOSSysCommandMinimize: ShowWindow(inWindow, kOSShowMinimize); break;
-        case kOSSysCommandMaximize: ShowWindow(inWindow, kOSShowMaximized); break;
-        case kOSSysCommandRestore: ShowWindow(inWindow, kOSShowRestore); break;
-        case kOSSysCommandClose: SendMessage(inWindow, kOSMsgClose, 0, 0); break;
-        default: break;
-      }
-      return 0;
-    default:
-      return 0;
-  }
+  return DefaultWindowProcedureOver(*this, inWindow, inMessage, inWParam, inLParam);
 }
 
 }  // namespace norvik::ui::headless

@@ -13,6 +13,7 @@
 #include <algorithm>
 #include <chrono>
 
+#include "ui/src/NativeQueueScan.h"
 #include "ui/src/headless/OS_NativeLayer_Headless.h"
 
 namespace norvik::ui::headless {
@@ -53,20 +54,7 @@ void OS_NativeLayer_Headless::PostMessage(OS_WindowHandle inWindow, unsigned inM
 
 bool OS_NativeLayer_Headless::PeekMessage(OS_Event& outEvent, OS_WindowHandle inWindow, unsigned inFirst,
                                           unsigned inLast, bool inRemove) {
-  const bool anyNumber = inFirst == 0 && inLast == 0;
-  for (auto it = mQueue.begin(); it != mQueue.end(); ++it) {
-    const OS_Event& event = it->event;
-    if (inWindow != 0 && event.GetHWnd() != inWindow) continue;
-    if (!anyNumber && (event.GetMsg() < inFirst || event.GetMsg() > inLast)) continue;
-    outEvent = event;
-    if (inRemove) {
-      // Taking an input message out of the queue makes its keyboard the current one.
-      if (it->hasKeyStates) mMessageKeys = it->keyStates;
-      mQueue.erase(it);
-    }
-    return true;
-  }
-  return false;
+  return PeekQueuedMessage(mQueue, mMessageKeys, outEvent, inWindow, inFirst, inLast, inRemove);
 }
 
 bool OS_NativeLayer_Headless::DeliverOne() {

@@ -212,6 +212,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void ApplyTopLevelHints(X11Window& ioWindow);
   void ApplyWindowState(X11Window& ioWindow);
   void DestroySubtree(OS_WindowHandle inWindow);
+  // Sends the destroy messages to a window and its children and forgets them.
+  void ForgetDestroyedWindow(OS_WindowHandle inWindow);
   std::vector<OS_WindowHandle>& SiblingsOf(const X11Window& inWindow);
   OS_WindowHandle TopLevelOf(OS_WindowHandle inWindow) const;
   OS_WindowHandle DeepestAt(OS_WindowHandle inWindow, OS_Point inScreen) const;

@@ -7,6 +7,7 @@
 
 #include "tarsel/ErrorManager.h"
 #include "ui/OS_DefaultWindowProcedure.h"
+#include "ui/src/NativeQueueScan.h"
 #include "ui/src/x11/OS_NativeLayer_X11.h"
 
 namespace norvik::ui::x11 {
@@ -250,6 +251,12 @@ void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
     case XCB_CONFIGURE_NOTIFY:
       TranslateConfigure(reinterpret_cast<xcb_configure_notify_event_t*>(inEvent));
       break;
+    case XCB_DESTROY_NOTIFY: {
+      // Destroyed by someone else: the window hears it is gone, as if we had destroyed it.
+      auto* destroyed = reinterpret_cast<xcb_destroy_notify_event_t*>(inEvent);
+      if (X11Window* window = Find(destroyed->window); window && !window->destroying) ForgetDestroyedWindow(destroyed->window);
+      break;
+    }
     case XCB_REPARENT_NOTIFY: {
       auto* reparent = reinterpret_cast<xcb_reparent_notify_event_t*>(inEvent);
       if (X11Window* window = Find(reparent->window); window && window->parent == 0)
@@ -291,19 +298,7 @@ void OS_NativeLayer_X11::PostMessage(OS_WindowHandle inWindow, unsigned inMessag
 bool OS_NativeLayer_X11::PeekMessage(OS_Event& outEvent, OS_WindowHandle inWindow, unsigned inFirst, unsigned inLast,
                                      bool inRemove) {
   DrainConnection();
-  const bool anyNumber = inFirst == 0 && inLast == 0;
-  for (auto it = mQueue.begin(); it != mQueue.end(); ++it) {
-    const OS_Event& event = it->event;
-    if (inWindow != 0 && event.GetHWnd() != inWindow) continue;
-    if (!anyNumber && (event.GetMsg() < inFirst || event.GetMsg() > inLast)) continue;
-    outEvent = event;
-    if (inRemove) {
-      if (it->hasKeyStates) mMessageKeyStates = it->keyStates;
-      mQueue.erase(it);
-    }
-    return true;
-  }
-  return false;
+  return PeekQueuedMessage(mQueue, mMessageKeyStates, outEvent, inWindow, inFirst, inLast, inRemove);
 }
 
 bool OS_NativeLayer_X11::DeliverOne() {

@@ -195,6 +195,14 @@ void OS_NativeLayer_X11::DestroySubtree(OS_WindowHandle inWindow) {
 void OS_NativeLayer_X11::DestroyWindow(OS_WindowHandle inWindow) {
   X11Window* window = Find(inWindow);
   if (!window || window->destroying) return;
+  xcb_destroy_window(mConnection, static_cast<xcb_window_t>(inWindow));
+  ForgetDestroyedWindow(inWindow);
+  xcb_flush(mConnection);
+}
+
+void OS_NativeLayer_X11::ForgetDestroyedWindow(OS_WindowHandle inWindow) {
+  X11Window* window = Find(inWindow);
+  if (!window || window->destroying) return;
   std::vector<OS_WindowHandle> subtree{inWindow};
   for (std::size_t i = 0; i < subtree.size(); ++i)
     if (X11Window* w = Find(subtree[i])) subtree.insert(subtree.end(), w->children.begin(), w->children.end());
@@ -209,9 +217,7 @@ void OS_NativeLayer_X11::DestroyWindow(OS_WindowHandle inWindow) {
     mActive = 0;
   }
   for (OS_WindowHandle h : subtree) CallProcedure(h, kOSMsgDestroy, 0, 0);
-  xcb_destroy_window(mConnection, static_cast<xcb_window_t>(inWindow));
   DestroySubtree(inWindow);
-  xcb_flush(mConnection);
 }
 
 bool OS_NativeLayer_X11::IsWindow(OS_WindowHandle inWindow) const { return Find(inWindow) != nullptr; }
