@@ -274,6 +274,13 @@ class UI_Node : public UI_NodeBase {
   // Tells the platform that inNode's window holds focus.
   static void UI_SetKeyboardFocusLeafNode(UI_Node* inNode);
   static void UI_ClearPreviousKeyboardFocus();
+  // True when a node from the parent of the focus leaf upwards is a hosted
+  // native text field; the leaf itself is not tested. The text-field class
+  // registers how to recognise one (SetTextEditControlTest), so the node core
+  // does not depend on it; with nothing registered the answer is false.
+  static bool UI_TextEditControlHasFocus();
+  using TextEditControlTest = bool (*)(const UI_Node* inNode);
+  static void SetTextEditControlTest(TextEditControlTest inTest);
   // Depth first in child order, the first descendant that wants focus.
   UI_Node* UI_GetFirstFocusableChildNode();
   // Tab and Shift+Tab on key down move focus on from inTarget (or from the
