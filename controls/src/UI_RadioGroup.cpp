@@ -58,7 +58,13 @@ UI_RadioButton* UI_RadioGroup::GetSelectedRadioButton() const {
 }
 
 bool UI_RadioGroup::UI_GainKeyboardFocus(ui::FocusChangeReason inReason) {
-  if (UI_RadioButton* selected = GetSelectedRadioButton()) return selected->UI_GainKeyboardFocus(inReason);
+  // Focus goes on to the selected button only when that button takes it: a
+  // button that does not hands focus back to its parent, this group, and
+  // forwarding again would never end.
+  UI_RadioButton* selected = GetSelectedRadioButton();
+  if (selected && selected->UI_WantsKeyboardFocus() &&
+      (inReason != ui::kFocusChangeAdvance || selected->UI_WantsKeyboardFocusFromAdvance()))
+    return selected->UI_GainKeyboardFocus(inReason);
   return UI_InteractiveControlView::UI_GainKeyboardFocus(inReason);
 }
 

@@ -97,5 +97,14 @@ TEST_F(RadioGroupTest, ARemovedButtonLeavesTheGroup) {
   EXPECT_EQ(radios[2]->GetValue(), UI_Button::kButtonOff);
 }
 
+TEST_F(RadioGroupTest, ClickingButtonsThatDoNotTakeFocusLeavesFocusAlone) {
+  for (const auto& radio : radios) radio->SetWantsKeyboardFocus(false);
+  Click(1);
+  Click(2);
+  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
+  EXPECT_FALSE(radios[2]->UI_HasKeyboardFocus(false));
+  EXPECT_FALSE(group->UI_GainKeyboardFocus(ui::kFocusChangeMouse)) << "the group itself does not take focus either";
+}
+
 }  // namespace
 }  // namespace norvik::controls::test
