@@ -17,6 +17,8 @@ class ActionRecorder {
   bool IsRecording() const;
   void RecordMouseEvent(ui::UI_Node* inNode, const ui::MouseEvent& inEvent);
   void RecordKeyboardEvent(ui::UI_Node* inNode, const ui::KeyboardEvent& inEvent);
+  // A menu choice that reached a window as a command with this item id.
+  void RecordMenuItemEvent(ui::UI_Node* inWindow, unsigned inItemID);
 
  private:
   ActionRecorder() = default;

@@ -13,4 +13,6 @@ void ActionRecorder::RecordMouseEvent(ui::UI_Node*, const ui::MouseEvent&) {}
 
 void ActionRecorder::RecordKeyboardEvent(ui::UI_Node*, const ui::KeyboardEvent&) {}
 
+void ActionRecorder::RecordMenuItemEvent(ui::UI_Node*, unsigned) {}
+
 }  // namespace norvik::automateui

@@ -7,6 +7,7 @@
 #include "drawbot/SupplierInterface.h"
 #include "drawbot/SurfaceInterface.h"
 #include "ui/InputPlatform.h"
+#include "ui/ActionRecorder.h"
 #include "ui/OS_Window.h"
 #include "ui/UI_NodeManager.h"
 
@@ -191,6 +192,7 @@ bool OS_Window::HandleMouseActivate(OS_Event* inEvent) {
 
 void OS_Window::HandleCommand(OS_Event* inEvent) {
   const unsigned code = HighWord(inEvent->GetWParam());
+  if (code == 0) automateui::ActionRecorder::GetInstance().RecordMenuItemEvent(this, LowWord(inEvent->GetWParam()));
   if (code != kOSEditSetFocus && code != kOSEditKillFocus) return;
   OS_NativeLayer* layer = GetNativeLayer();
   if (!layer) return;
