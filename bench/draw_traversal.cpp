@@ -15,72 +15,18 @@
 #include "ui/Theme.h"
 #include "ui/UI_SubView.h"
 
+#include "support/PanelCells.h"
+
 namespace {
 
-using norvik::drawbot::BrushP;
+using norvik::bench::CellResources;
+using norvik::bench::kPanelColumns;
+using norvik::bench::kPanelRows;
 using norvik::drawbot::ColorRGBA;
-using norvik::drawbot::FontP;
 using norvik::drawbot::PathP;
-using norvik::drawbot::PenP;
 using norvik::drawbot::SurfaceP;
 using norvik::ui::UI_Node;
 using tarsel::geom::RectT;
-
-constexpr int kColumns = 40;
-constexpr int kRows = 50;
-constexpr float kCellWidth = 48;
-constexpr float kCellHeight = 21;
-
-// Drawing resources shared by all cells, as a control family shares them
-// through its resource cache.
-struct CellResources {
-  explicit CellResources(norvik::drawbot::SupplierInterface const* inSupplier)
-      : fill(inSupplier, norvik::ui::GetColor(7)),
-        stroke(inSupplier, norvik::ui::GetColor(1), 1),
-        text(inSupplier, norvik::ui::GetColor(1)),
-        font(MakeFont(inSupplier)) {}
-
-  // The theme's font when the platform has it, else the platform's own sans.
-  static FontP MakeFont(norvik::drawbot::SupplierInterface const* inSupplier) {
-    try {
-      return FontP(inSupplier, norvik::ui::GetFontName(0), u"", norvik::ui::GetFontSize(0));
-    } catch (const tarsel::config::Exception&) {
-      return FontP(inSupplier, u"DejaVu Sans", u"", norvik::ui::GetFontSize(0));
-    }
-  }
-  BrushP fill;
-  PenP stroke;
-  BrushP text;
-  FontP font;
-};
-
-std::u16string Digits(int inValue) {
-  const std::string ascii = std::to_string(inValue);
-  return std::u16string(ascii.begin(), ascii.end());
-}
-
-class CellView : public norvik::ui::UI_SubView {
- public:
-  CellView(const CellResources* inResources, int inIndex, norvik::drawbot::SupplierInterface const* inSupplier)
-      : mResources(inResources), mLabel(u"Ch " + Digits(inIndex)), mPath(inSupplier) {
-    mPath->AddRect(RectT<float>(0.5f, 0.5f, kCellWidth - 1, kCellHeight - 1));
-  }
-
-  void UI_Draw(norvik::drawbot::Drawbot* inDrawbot) override {
-    norvik::drawbot::SurfaceInterface* surface = inDrawbot->GetSurface();
-    surface->FillPath(*mResources->fill, *mPath, norvik::drawbot::kFillWinding);
-    surface->StrokePath(*mResources->stroke, *mPath);
-    surface->DrawString(*mResources->text, *mResources->font,
-                        reinterpret_cast<unsigned short const*>(mLabel.c_str()),
-                        tarsel::geom::PointT<float>(4, 15), norvik::drawbot::kTextAlignLeft,
-                        norvik::drawbot::kTextTruncationNone, 0);
-  }
-
- private:
-  const CellResources* mResources;
-  std::u16string mLabel;
-  PathP mPath;
-};
 
 class Panel {
  public:
@@ -93,16 +39,8 @@ class Panel {
     mRoot->UI_SetLocalRectF(RectT<float>(0, 0, 1920, 1080));
     mRoot->UI_Show(true);
     mRoot->UI_SetDrawCachePolicy(UI_Node::kDrawCacheNever);
-    for (int row = 0; row < kRows; ++row) {
-      for (int column = 0; column < kColumns; ++column) {
-        boost::intrusive_ptr<CellView> cell(new CellView(&mResources, row * kColumns + column, mSupplier));
-        cell->UI_SetLocalRectF(RectT<float>(column * kCellWidth, row * kCellHeight, kCellWidth, kCellHeight));
-        cell->UI_Show(true);
-        cell->UI_SetDrawCachePolicy(inCellPolicy);
-        mRoot->ChildPushBack(cell);
-        mCells.push_back(cell.get());
-      }
-    }
+    norvik::bench::AddPanelCells(mRoot.get(), &mResources, mSupplier, inCellPolicy,
+                                 [this](UI_Node* inCell) { mCells.push_back(inCell); });
   }
 
   void Paint() {
@@ -137,7 +75,7 @@ void FullRepaintWithoutCaches(benchmark::State& state) {
   norvik::ui::OS_NodeManager manager;
   Panel panel(UI_Node::kDrawCacheNever);
   for (auto _ : state) panel.Paint();
-  state.SetItemsProcessed(state.iterations() * kColumns * kRows);
+  state.SetItemsProcessed(state.iterations() * kPanelColumns * kPanelRows);
 }
 BENCHMARK(FullRepaintWithoutCaches)->Unit(benchmark::kMillisecond);
 
@@ -146,7 +84,7 @@ void FullRepaintWithValidCaches(benchmark::State& state) {
   Panel panel(UI_Node::kDrawCacheAlways);
   panel.Paint();  // fills every cache
   for (auto _ : state) panel.Paint();
-  state.SetItemsProcessed(state.iterations() * kColumns * kRows);
+  state.SetItemsProcessed(state.iterations() * kPanelColumns * kPanelRows);
 }
 BENCHMARK(FullRepaintWithValidCaches)->Unit(benchmark::kMillisecond);
 

@@ -18,58 +18,17 @@
 #include "ui/Theme.h"
 #include "ui/UI_SubView.h"
 
+#include "support/PanelCells.h"
+
 namespace {
 
-using norvik::drawbot::BrushP;
-using norvik::drawbot::FontP;
-using norvik::drawbot::PathP;
-using norvik::drawbot::PenP;
+using norvik::bench::CellResources;
+using norvik::bench::kPanelColumns;
+using norvik::bench::kPanelRows;
 using norvik::ui::OS_Point;
 using norvik::ui::OS_Rect;
 using norvik::ui::UI_Node;
 using tarsel::geom::RectT;
-
-constexpr int kColumns = 40;
-constexpr int kRows = 50;
-constexpr float kCellWidth = 48;
-constexpr float kCellHeight = 21;
-
-struct CellResources {
-  explicit CellResources(norvik::drawbot::SupplierInterface const* inSupplier)
-      : fill(inSupplier, norvik::ui::GetColor(7)),
-        stroke(inSupplier, norvik::ui::GetColor(1), 1),
-        text(inSupplier, norvik::ui::GetColor(1)),
-        font(inSupplier, u"DejaVu Sans", u"", norvik::ui::GetFontSize(0)) {}
-  BrushP fill;
-  PenP stroke;
-  BrushP text;
-  FontP font;
-};
-
-class CellView : public norvik::ui::UI_SubView {
- public:
-  CellView(const CellResources* inResources, int inIndex, norvik::drawbot::SupplierInterface const* inSupplier)
-      : mResources(inResources), mPath(inSupplier) {
-    const std::string digits = std::to_string(inIndex);
-    mLabel = u"Ch " + std::u16string(digits.begin(), digits.end());
-    mPath->AddRect(RectT<float>(0.5f, 0.5f, kCellWidth - 1, kCellHeight - 1));
-    UI_SetDrawCachePolicy(kDrawCacheNever);
-  }
-
-  void UI_Draw(norvik::drawbot::Drawbot* inDrawbot) override {
-    norvik::drawbot::SurfaceInterface* surface = inDrawbot->GetSurface();
-    surface->FillPath(*mResources->fill, *mPath, norvik::drawbot::kFillWinding);
-    surface->StrokePath(*mResources->stroke, *mPath);
-    surface->DrawString(*mResources->text, *mResources->font, reinterpret_cast<unsigned short const*>(mLabel.c_str()),
-                        tarsel::geom::PointT<float>(4, 15), norvik::drawbot::kTextAlignLeft,
-                        norvik::drawbot::kTextTruncationNone, 0);
-  }
-
- private:
-  const CellResources* mResources;
-  std::u16string mLabel;
-  PathP mPath;
-};
 
 // A view that answers mouse events, so that a move is handled at the leaf.
 class HoverView : public norvik::ui::UI_SubView {
@@ -114,20 +73,13 @@ void NativePaintOfLargePanel(benchmark::State& state) {
   window->UI_Show(true);
   auto* supplier = window->UI_GetDrawSupplier();
   CellResources resources(supplier);
-  for (int row = 0; row < kRows; ++row) {
-    for (int column = 0; column < kColumns; ++column) {
-      boost::intrusive_ptr<CellView> cell(new CellView(&resources, row * kColumns + column, supplier));
-      cell->UI_SetLocalRectF(RectT<float>(column * kCellWidth, row * kCellHeight, kCellWidth, kCellHeight));
-      cell->UI_Show(true);
-      window->ChildPushBack(cell);
-    }
-  }
+  norvik::bench::AddPanelCells(window.get(), &resources, supplier, UI_Node::kDrawCacheNever, [](UI_Node*) {});
   desktop.system.Pump();
   for (auto _ : state) {
     window->UI_Invalidate(nullptr, 0);
     window->UI_UpdateNow();
   }
-  state.SetItemsProcessed(state.iterations() * kColumns * kRows);
+  state.SetItemsProcessed(state.iterations() * kPanelColumns * kPanelRows);
 }
 BENCHMARK(NativePaintOfLargePanel)->Unit(benchmark::kMillisecond);
 
