@@ -12,6 +12,7 @@
 #include "drawbot/DrawbotWrappers.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/drawbot/RecordingSupplier.h"
+#include "support/tarsel/ErrorText.h"
 #include "tarsel/ThrowError.h"
 
 namespace norvik::drawbot {
@@ -22,15 +23,7 @@ using tarsel::geom::RectT;
 using testing::PixelCanvas;
 using testing::PixelImage;
 
-template <typename F>
-std::string ErrorOf(F&& inCall) {
-  try {
-    inCall();
-  } catch (tarsel::config::Exception const& e) {
-    return e.what();
-  }
-  return "no error";
-}
+using norvik::test::ErrorOf;
 
 // A 4 x 3 picture with opaque, half-transparent and empty pixels.
 PixelImage Checker() {

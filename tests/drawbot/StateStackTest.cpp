@@ -5,6 +5,7 @@
 #include "drawbot/DrawbotWrappers.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/drawbot/RecordingSupplier.h"
+#include "support/tarsel/ErrorText.h"
 #include "tarsel/ThrowError.h"
 
 namespace norvik::drawbot {
@@ -16,15 +17,7 @@ using tarsel::geom::RectT;
 using testing::PixelCanvas;
 using testing::RecordingSupplier;
 
-template <typename F>
-std::string ErrorOf(F&& inCall) {
-  try {
-    inCall();
-  } catch (tarsel::config::Exception const& e) {
-    return e.what();
-  }
-  return "no error";
-}
+using norvik::test::ErrorOf;
 
 TEST(StateStack, AFreshSurfaceHasTheDocumentedDefaults) {
   SurfaceP surface(NewOSSupplier(), 20, 10);
