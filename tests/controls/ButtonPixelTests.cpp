@@ -3,9 +3,11 @@
 // reference images.
 #include <functional>
 #include <string>
+#include <vector>
 
 #include <gtest/gtest.h>
 
+#include "controls/UI_ButtonBar.h"
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_DisclosureTriangleButton.h"
 #include "controls/UI_RadioButton.h"
@@ -116,6 +118,36 @@ TEST_P(ButtonPixelTest, DisclosureTrianglesClosedAndOpen) {
                                               inVariant == 1 ? 90.0f : 0.0f, inDrawbot);
   });
   EXPECT_TRUE(MatchesReference(image, Name("disclosure_triangle")));
+}
+
+// The bar's frame in the look's state, with three segments on it painted as
+// the bar's text buttons paint themselves: the focus ring belongs to the bar,
+// and the on look shows the middle segment selected (down).
+TEST_P(ButtonPixelTest, ButtonBarsInEachState) {
+  const auto image = Render([](const ui::ThemeP& inTheme, StateFlags inState, int inVariant, const RectF& inRect,
+                               drawbot::Drawbot& inDrawbot) {
+    const std::vector<RectF> segments = UI_ButtonBar::LayoutRow(3, tarsel::geom::PointT<float>(28, inRect.height));
+    DrawButtonParameters frame;
+    frame.SetTheme(inTheme);
+    frame.SetControlState(inState);
+    frame.SetRectF(RectF(inRect.left, inRect.top, segments.back().left + segments.back().width, inRect.height));
+    UI_ButtonBar::DrawFrame(frame, inDrawbot);
+    const char16_t* labels[] = {u"L", u"M", u"H"};
+    for (std::size_t i = 0; i < segments.size(); ++i) {
+      StateFlags state = inState;
+      state.Clear(UI_ControlView::kStateFocused | UI_ControlView::kStateDown);
+      if (inVariant == 1 && i == 1) state.Set(UI_ControlView::kStateDown);
+      DrawTextButtonParameters params;
+      params.SetTheme(inTheme);
+      params.SetControlState(state);
+      params.SetRectF(RectF(inRect.left + segments[i].left, inRect.top, segments[i].width, segments[i].height));
+      params.SetDrawOutline(state.TestAny(UI_ControlView::kStateRollover | UI_ControlView::kStateDown) &&
+                            !state.Test(UI_ControlView::kStateDisabled));
+      params.SetText(labels[i]);
+      UI_TextButton::Draw(params, inDrawbot);
+    }
+  });
+  EXPECT_TRUE(MatchesReference(image, Name("button_bar")));
 }
 
 INSTANTIATE_TEST_SUITE_P(Themes, ButtonPixelTest, ::testing::Values(false, true),
