@@ -1,7 +1,10 @@
 #pragma once
 // A control that owns radio buttons: at most one of its direct radio children
 // is on, arrow keys move the selection (without wrapping), and the group's
-// listeners hear each child's change as the group's own.
+// listeners hear each child's change as the group's own. The group is one tab
+// stop: Tab and Shift+Tab on one of its buttons leave the group rather than
+// walking through its other buttons.
+#include <memory>
 #include <vector>
 
 #include "controls/UI_RadioButton.h"
@@ -16,6 +19,7 @@ class UI_RadioGroup : public UI_InteractiveControlView {
   void ChildAdded(ui::UI_Node* inChild) override;
   void ChildRemoved(ui::UI_Node* inChild) override;
   bool UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
+  bool UI_DoPreKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
   bool UI_GainKeyboardFocus(ui::FocusChangeReason inReason) override;
 
   // Index i among the radio children goes on, the others off.
@@ -29,8 +33,13 @@ class UI_RadioGroup : public UI_InteractiveControlView {
   void AssociateRadioButton(UI_RadioButton* inButton);
   void RadioChanged(UI_ControlChangedMessage* inMessage);
   int IndexOf(const UI_RadioButton* inButton) const;
+  // Moves focus to the next (or previous) node in tab order outside the group.
+  bool LeaveGroup(bool inForward);
 
   std::vector<UI_RadioButton*> mButtons;
+  // Holds the group among the keyboard filters while it has buttons, so that
+  // it sees Tab before the focused button's ancestors advance focus.
+  std::unique_ptr<ui::UI_NodeManager::AddAndRemoveKeyboardEventFilterNode> mTabFilter;
   bool mDrawBorder = false;
 };
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "ui/KeyboardEvent.h"
+#include "ui/UI_Container.h"
 
 namespace norvik::controls {
 
@@ -23,6 +24,9 @@ void UI_RadioGroup::ChildRemoved(ui::UI_Node* inChild) {
 
 void UI_RadioGroup::AssociateRadioButton(UI_RadioButton* inButton) {
   mButtons.push_back(inButton);
+  if (!mTabFilter)
+    mTabFilter = std::make_unique<ui::UI_NodeManager::AddAndRemoveKeyboardEventFilterNode>(
+        ui::UI_NodeManager::Get(), this);
   // The button is owned by this group, so the listener cannot outlive it.
   inButton->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
       [this](UI_ControlChangedMessage* inMessage) { RadioChanged(inMessage); }));
@@ -66,6 +70,30 @@ bool UI_RadioGroup::UI_GainKeyboardFocus(ui::FocusChangeReason inReason) {
       (inReason != ui::kFocusChangeAdvance || selected->UI_WantsKeyboardFocusFromAdvance()))
     return selected->UI_GainKeyboardFocus(inReason);
   return UI_InteractiveControlView::UI_GainKeyboardFocus(inReason);
+}
+
+bool UI_RadioGroup::UI_DoPreKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) {
+  if (inEvent.IsActionKeyDown() && inEvent.GetCode().GetControlCode() == ui::kControlCodeTab) {
+    ModKeys keys = inEvent.GetModKey();
+    keys.Clear(ui::kModKeyCapsLock);
+    const bool forward = keys == ModKeys();
+    auto* radio = dynamic_cast<UI_RadioButton*>(inTarget);
+    if ((forward || keys == ModKeys(ui::kModKeyShift)) && radio && IndexOf(radio) >= 0 && LeaveGroup(forward))
+      return true;
+  }
+  return UI_InteractiveControlView::UI_DoPreKeyboardEvent(inTarget, inEvent);
+}
+
+// The walk starts from the group's own place among its siblings, so none of
+// the group's children is offered focus on the way out. When nothing outside
+// takes focus the walk may come round to the group again, which hands focus
+// back to its selected button.
+bool UI_RadioGroup::LeaveGroup(bool inForward) {
+  ui::UI_Container* parent = UI_GetParentContainer();
+  if (!parent) return false;
+  ui::UI_NodeProtector protector(this);
+  ui::UI_Node::UI_AdvanceFocus(inForward, UI_GetIndex(), parent);
+  return true;
 }
 
 bool UI_RadioGroup::UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) {

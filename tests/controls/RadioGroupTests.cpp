@@ -12,6 +12,7 @@ namespace {
 
 using ::testing::ElementsAre;
 
+constexpr short kTab = 9;
 constexpr short kLeft = 37;
 constexpr short kRight = 39;
 
@@ -104,6 +105,56 @@ TEST_F(RadioGroupTest, ClickingButtonsThatDoNotTakeFocusLeavesFocusAlone) {
   EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
   EXPECT_FALSE(radios[2]->UI_HasKeyboardFocus(false));
   EXPECT_FALSE(group->UI_GainKeyboardFocus(ui::kFocusChangeMouse)) << "the group itself does not take focus either";
+}
+
+// The group stands between two views that take focus, so that Tab has
+// somewhere to go on either side.
+class RadioGroupTabTest : public RadioGroupTest {
+ protected:
+  RadioGroupTabTest() {
+    root->ChildRemove(group.get());
+    before = ui::test::AddView(*root, "before");
+    root->ChildPushBack(group);
+    after = ui::test::AddView(*root, "after");
+    group->SetIndex(0);
+    radios[1]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  }
+  static ui::UI_Node* FocusLeaf() { return ui::UI_Node::UI_GetKeyboardFocusLeafNode(); }
+
+  ui::test::FocusableViewP before, after;
+};
+
+TEST_F(RadioGroupTabTest, TabLeavesTheGroupPastItsOtherButtons) {
+  ASSERT_EQ(FocusLeaf(), radios[1].get());
+  EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9));
+  EXPECT_EQ(FocusLeaf(), after.get());
+}
+
+TEST_F(RadioGroupTabTest, ShiftTabLeavesTheGroupBackwards) {
+  EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9, ModKeys(ui::kModKeyShift)));
+  EXPECT_EQ(FocusLeaf(), before.get());
+}
+
+TEST_F(RadioGroupTabTest, CapsLockDoesNotChangeTab) {
+  EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9, ModKeys(ui::kModKeyCapsLock | ui::kModKeyShift)));
+  EXPECT_EQ(FocusLeaf(), before.get());
+}
+
+TEST_F(RadioGroupTabTest, OtherTabsAndOtherTargetsAreLeftAlone) {
+  EXPECT_FALSE(KeyDown(radios[1].get(), kTab, 9, ModKeys(ui::kModKeyCtrl)));
+  EXPECT_FALSE(KeyUp(radios[1].get(), kTab, 9));
+  EXPECT_EQ(FocusLeaf(), radios[1].get());
+  before->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  EXPECT_FALSE(KeyDown(before.get(), kTab, 9)) << "a node outside the group is not the group's business";
+  EXPECT_EQ(FocusLeaf(), before.get());
+}
+
+TEST_F(RadioGroupTabTest, WithNothingOutsideTabComesBackToTheSelectedButton) {
+  before->mWantsFocus = false;
+  after->mWantsFocus = false;
+  root->mWantsFocus = false;
+  EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9));
+  EXPECT_EQ(FocusLeaf(), radios[0].get()) << "the group hands focus to its selection";
 }
 
 }  // namespace
