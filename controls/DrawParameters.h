@@ -16,6 +16,7 @@
 
 namespace norvik::drawbot {
 class Drawbot;
+class ImageInterface;
 }
 
 namespace norvik::controls {
@@ -166,6 +167,25 @@ class DrawTextButtonParameters : public DrawButtonParameters, public DrawTextCon
 class DrawPictureTextButtonParameters : public DrawTextButtonParameters {
  public:
   using DrawTextButtonParameters::DrawTextButtonParameters;
+};
+
+// A picture button's look: the image on the bevel, with its scale and alpha.
+// The image is not owned; it lives in the image cache or with the supplier.
+class DrawPictureButtonParameters : public DrawButtonParameters {
+ public:
+  DrawPictureButtonParameters() = default;
+  explicit DrawPictureButtonParameters(const UI_ControlView* inControl);
+  const drawbot::ImageInterface* GetImage() const { return mImage; }
+  void SetImage(const drawbot::ImageInterface* inImage) { mImage = inImage; }
+  float GetScale() const { return mScale; }
+  void SetScale(float inScale) { mScale = inScale; }
+  float GetAlpha() const { return mAlpha; }
+  void SetAlpha(float inAlpha) { mAlpha = inAlpha; }
+
+ private:
+  const drawbot::ImageInterface* mImage = nullptr;
+  float mScale = 1;
+  float mAlpha = 1;
 };
 
 class DrawCheckBoxParams : public DrawButtonParameters, public DrawTextControlBaseParameters {

@@ -94,6 +94,10 @@ class UI_Button : public UI_InteractiveControlView, public UI_ColorChangeSupport
   bool ShouldDisplayContainerAlways() const { return mContainerDisplay == kDisplayAlways; }
   bool ShouldDisplayContainerNever() const { return mContainerDisplay == kDisplayNever; }
   void SetInsetUndrawnSpace(bool inInset);
+  // With this on, a button at rest (not down, lit or focused) paints no
+  // chrome at all, only its face: a tool-bar look.
+  void SetDisplayChromelessNormalState(bool inOn);
+  bool GetDisplayChromelessNormalState() const { return mChromelessNormalState; }
 
   // ---- modifier tool tips ----
   void InsertModifiedToolTip(ModKeys inKeys, const UTF16String& inText);

@@ -7,6 +7,20 @@
 
 namespace norvik::controls {
 
+// The mark in a check box: the tick when on, the mixed bar when mixed or
+// unknown, nothing when off. Scaled to the rectangle it is given.
+class DrawCheckbox : public DrawButtonFace {
+ public:
+  explicit DrawCheckbox(const DrawCheckBoxParams& inParams) : mParams(inParams) {}
+  void operator()(DrawParameters::StateFlags inState, const tarsel::geom::RectT<float>& inRect,
+                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme& inTheme,
+                  const ColorChangeMap* inMap) const override;
+  void Paint(const tarsel::geom::RectT<float>& inBox, drawbot::Drawbot& inDrawbot) const;
+
+ private:
+  const DrawCheckBoxParams& mParams;
+};
+
 class UI_Checkbox : public UI_Button, public UI_TextControlBase {
  public:
   enum CheckboxValue { kOff = 0, kOn = 1, kMixed = 2 };
@@ -31,6 +45,8 @@ class UI_Checkbox : public UI_Button, public UI_TextControlBase {
   // The box (left, inCheckSize wide) and the label (the rest, 3 further in).
   static std::pair<RectF, RectF> GetButtonTextRects(float inCheckSize, const RectF& inRect);
   static void Draw(const DrawCheckBoxParams& inParams, drawbot::Drawbot& inDrawbot);
+  // The box's four nested gradients, its mark and the label, unclipped.
+  static void DrawHelper(const DrawCheckBoxParams& inParams, drawbot::Drawbot& inDrawbot);
 
  private:
   CheckboxValue NextValue() const;

@@ -7,6 +7,29 @@
 
 namespace norvik::controls {
 
+// The face of a disclosure triangle: the triangle at rest, closed or open
+// by the button's value, or part way through its twirl. While the button is
+// held it points where a release would leave it, following the press look.
+class DrawTrianglePicture : public DrawButtonFace {
+ public:
+  // inTime is the seconds into the twirl, or -1 when none runs.
+  DrawTrianglePicture(const DrawParameters& inParams, double inTime, double inDuration, bool inValue,
+                      bool inCaptured, float inScale);
+  // 0 degrees points right (closed), 90 down (open).
+  float GetAngle(DrawParameters::StateFlags inState) const;
+  void operator()(DrawParameters::StateFlags inState, const tarsel::geom::RectT<float>& inRect,
+                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme& inTheme,
+                  const ColorChangeMap* inMap) const override;
+
+ private:
+  const DrawParameters& mParams;
+  double mTime;
+  double mDuration;
+  bool mValue;
+  bool mCaptured;
+  float mScale;
+};
+
 class UI_DisclosureTriangleButton : public UI_PictureTextButton {
  public:
   explicit UI_DisclosureTriangleButton(const UTF16String& inText = UTF16String());

@@ -22,7 +22,13 @@ class UI_PictureButton : public UI_Button {
   void SetAlpha(float inAlpha);
   // The image for the current state from the supply function, else null.
   const drawbot::ImageInterface* GetImage() const;
+  // Return (with no modifier) also activates the button while it has focus.
+  void SetSupportLegacyWindowsKeyboardActivation(bool inOn) { mReturnActivates = inOn; }
+  bool UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+
+  // Paints the bevel and, when the record has one, its image as the face.
+  static void Draw(const DrawPictureButtonParameters& inParams, drawbot::Drawbot& inDrawbot);
 
   // Centres inImage in inRect at whole pixels; disabled images are faded by
   // the alpha of theme colour 306.
@@ -36,6 +42,7 @@ class UI_PictureButton : public UI_Button {
   ImageSupplyFunction mSupply;
   float mScale = 1;
   float mAlpha = 1;
+  bool mReturnActivates = false;
 };
 
 // A button that paints nothing itself: its owner's function draws it.

@@ -8,7 +8,16 @@ namespace norvik::controls {
 
 class UI_PictureTextButton : public UI_TextButton {
  public:
+  // Which parts the button shows.
+  enum Style { kStylePictureAndText = 0, kStylePictureOnly = 1, kStyleTextOnly = 2 };
+
   explicit UI_PictureTextButton(const UTF16String& inText = UTF16String());
+
+  // Where the picture and its label, as one block, sit across the button.
+  void SetImageAndTextAlignment(drawbot::TextAlignment inAlignment);
+  drawbot::TextAlignment GetImageAndTextAlignment() const { return mBlockAlignment; }
+  void SetStyle(Style inStyle);
+  Style GetStyle() const { return mStyle; }
 
   void SetSpacingBetweenPictureAndText(float inSpacing);
   void SetPictureVerticalOffset(float inOffset);
@@ -18,7 +27,8 @@ class UI_PictureTextButton : public UI_TextButton {
   const UTF8String& GetImageBaseName() const { return mImageBaseName; }
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
 
-  // The picture's side, and the picture and label rectangles of inRect.
+  // The picture's side, and the picture and label rectangles of inRect. A
+  // part the style hides gets an empty rectangle.
   float GetPictureSize() const { return 12 * mScale; }
   std::pair<RectF, RectF> ComputeTextAndImageOffset(const RectF& inRect) const;
 
@@ -31,6 +41,8 @@ class UI_PictureTextButton : public UI_TextButton {
   float mSpacing = 4;
   float mVerticalOffset = 0;
   float mScale = 1;
+  drawbot::TextAlignment mBlockAlignment = drawbot::kTextAlignLeft;
+  Style mStyle = kStylePictureAndText;
 };
 
 }  // namespace norvik::controls

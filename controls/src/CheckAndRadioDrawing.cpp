@@ -75,28 +75,6 @@ drawbot::ColorRGBA MarkColor(const DrawParameters& inParams) {
                                                                                         : kMarkColor);
 }
 
-void PaintTick(const DrawCheckBoxParams& inParams, const RectF& inBox, drawbot::Drawbot& inDrawbot) {
-  const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
-  const bool mixed = inParams.GetValue() == UI_Checkbox::kMixed || inParams.GetValueUnknown();
-  if (inParams.GetValue() == UI_Checkbox::kOff && !mixed) return;
-  drawbot::PathP path(supplier);
-  drawbot::PenP pen(supplier, MarkColor(inParams), std::max(1.5f, inBox.width / 7));
-  if (!path || !pen) return;
-  const float s = inBox.width;
-  auto at = [&](float inX, float inY) { return PointF(inBox.left + inX * s, inBox.top + inY * inBox.height); };
-  if (mixed) {
-    path->MoveTo(at(0.25f, 0.5f));
-    path->LineTo(at(0.75f, 0.5f));
-  } else {
-    path->MoveTo(at(0.22f, 0.52f));
-    path->LineTo(at(0.42f, 0.72f));
-    path->LineTo(at(0.78f, 0.28f));
-  }
-  drawbot::ScSurfaceState state(inDrawbot.GetSurface());
-  inDrawbot.GetSurface()->SetAntiAliasPolicy(drawbot::kAntiAlias);
-  inDrawbot.GetSurface()->StrokePath(*pen, *path);
-}
-
 RectF CentredBox(float inSize, const RectF& inColumn) {
   return RectF(inColumn.left, inColumn.top + std::floor((inColumn.height - inSize) / 2), inSize, inSize);
 }
@@ -113,14 +91,47 @@ std::pair<RectF, RectF> UI_RadioButton::GetButtonTextRects(float inButtonSize, c
   return UI_Checkbox::GetButtonTextRects(inButtonSize, inRect);
 }
 
+void DrawCheckbox::operator()(DrawParameters::StateFlags, const tarsel::geom::RectT<float>& inRect,
+                              const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot,
+                              const ui::Theme&, const ColorChangeMap*) const {
+  Paint(RectF(inRect.left + inOffset.x, inRect.top + inOffset.y, inRect.width, inRect.height), inDrawbot);
+}
+
+void DrawCheckbox::Paint(const tarsel::geom::RectT<float>& inBox, drawbot::Drawbot& inDrawbot) const {
+  const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
+  const bool mixed = mParams.GetValue() == UI_Checkbox::kMixed || mParams.GetValueUnknown();
+  if ((mParams.GetValue() == UI_Checkbox::kOff && !mixed) || !supplier || !inDrawbot.GetSurface()) return;
+  drawbot::PathP path(supplier);
+  drawbot::PenP pen(supplier, MarkColor(mParams), std::max(1.5f, inBox.width / 7));
+  if (!path || !pen) return;
+  const RectF& box = inBox;
+  auto at = [&](float inX, float inY) { return PointF(box.left + inX * box.width, box.top + inY * box.height); };
+  if (mixed) {
+    path->MoveTo(at(0.25f, 0.5f));
+    path->LineTo(at(0.75f, 0.5f));
+  } else {
+    path->MoveTo(at(0.22f, 0.52f));
+    path->LineTo(at(0.42f, 0.72f));
+    path->LineTo(at(0.78f, 0.28f));
+  }
+  drawbot::ScSurfaceState state(inDrawbot.GetSurface());
+  inDrawbot.GetSurface()->SetAntiAliasPolicy(drawbot::kAntiAlias);
+  inDrawbot.GetSurface()->StrokePath(*pen, *path);
+}
+
 void UI_Checkbox::Draw(const DrawCheckBoxParams& inParams, drawbot::Drawbot& inDrawbot) {
   if (!inDrawbot.GetSurface()) return;
   drawbot::ScSurfaceState state(inDrawbot.GetSurface());
   ui::UI_Node::UI_ClipToRect(inParams.GetRectF(), &inDrawbot);
+  DrawHelper(inParams, inDrawbot);
+}
+
+void UI_Checkbox::DrawHelper(const DrawCheckBoxParams& inParams, drawbot::Drawbot& inDrawbot) {
+  if (!inDrawbot.GetSurface()) return;
   const auto [column, text] = GetButtonTextRects(inParams.GetCheckSize(), inParams.GetRectF());
   const RectF box = CentredBox(inParams.GetCheckSize(), column);
   PaintRings(inParams, box, false, inDrawbot);
-  PaintTick(inParams, box, inDrawbot);
+  DrawCheckbox(inParams).Paint(box, inDrawbot);
   DrawTextControlBaseParameters label(inParams);
   label.SetTextAlignment(drawbot::kTextAlignLeft);
   DrawControlLabel(inParams, label, text, inDrawbot);

@@ -46,6 +46,9 @@ DrawButtonParameters::DrawButtonParameters(const UI_ControlView* inControl) : Dr
 DrawTextButtonParameters::DrawTextButtonParameters(const UI_ControlView* inControl)
     : DrawButtonParameters(inControl) {}
 
+DrawPictureButtonParameters::DrawPictureButtonParameters(const UI_ControlView* inControl)
+    : DrawButtonParameters(inControl) {}
+
 DrawCheckBoxParams::DrawCheckBoxParams(const UI_ControlView* inControl) : DrawButtonParameters(inControl) {}
 
 DrawRadioButtonParams::DrawRadioButtonParams(const UI_ControlView* inControl) : DrawButtonParameters(inControl) {}

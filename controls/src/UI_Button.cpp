@@ -268,6 +268,12 @@ void UI_Button::SetInsetUndrawnSpace(bool inInset) {
   UI_Invalidate(nullptr, 0);
 }
 
+void UI_Button::SetDisplayChromelessNormalState(bool inOn) {
+  if (mChromelessNormalState == inOn) return;
+  mChromelessNormalState = inOn;
+  UI_Invalidate(nullptr, 0);
+}
+
 void UI_Button::SetDisplay(std::int32_t& ioField, std::int32_t inValue) {
   if (ioField == inValue) return;
   ioField = inValue;
@@ -285,6 +291,10 @@ void UI_Button::FillButtonParameters(DrawButtonParameters& ioParams) const {
   ioParams.SetDrawInnerGradient(mDrawInnerGradient);
   ioParams.SetDrawContainer(!ShouldDisplayContainerNever());
   ioParams.SetDrawOutline(!ShouldDisplayBorderNever());
+  if (mChromelessNormalState && !ioParams.GetControlState().TestAny(kStateDown | kStateRollover | kStateFocused)) {
+    ioParams.SetDrawContainer(false);
+    ioParams.SetDrawOutline(false);
+  }
 }
 
 void UI_Button::UI_Draw(drawbot::Drawbot* inDrawbot) {

@@ -54,16 +54,39 @@ bool UI_DisclosureTriangleButton::UI_DoTimerNotify(long inTimerID) {
   return true;
 }
 
+DrawTrianglePicture::DrawTrianglePicture(const DrawParameters& inParams, double inTime, double inDuration,
+                                         bool inValue, bool inCaptured, float inScale)
+    : mParams(inParams),
+      mTime(inTime),
+      mDuration(inDuration),
+      mValue(inValue),
+      mCaptured(inCaptured),
+      mScale(inScale) {}
+
+float DrawTrianglePicture::GetAngle(DrawParameters::StateFlags inState) const {
+  const bool open = mCaptured ? inState.Test(UI_ControlView::kStateDown) : mValue;
+  if (mTime < 0 || mDuration <= 0) return open ? 90.0f : 0.0f;
+  const float progress = static_cast<float>(std::clamp(mTime / mDuration, 0.0, 1.0));
+  return open ? 90.0f * progress : 90.0f * (1 - progress);
+}
+
+void DrawTrianglePicture::operator()(DrawParameters::StateFlags inState, const tarsel::geom::RectT<float>& inRect,
+                                     const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot,
+                                     const ui::Theme&, const ColorChangeMap*) const {
+  // The triangle keeps its scaled size however large the rectangle it is centred in.
+  const float side = std::min({inRect.width, inRect.height, 12 * mScale});
+  const tarsel::geom::RectT<float> square(inRect.left + inOffset.x + (inRect.width - side) / 2,
+                                         inRect.top + inOffset.y + (inRect.height - side) / 2, side, side);
+  UI_DisclosureTriangleButton::DrawTriangle(mParams, square, GetAngle(inState), inDrawbot);
+}
+
 void UI_DisclosureTriangleButton::DrawPicture(const DrawParameters& inParams, const RectF& inRect,
                                               drawbot::Drawbot& inDrawbot) {
-  const bool open = GetDownState();
-  float angle = open ? 90.0f : 0.0f;
-  const double t = GetAnimationTime();
-  if (t >= 0 && mTwirlDuration > 0) {
-    const float progress = static_cast<float>(std::clamp(t / mTwirlDuration, 0.0, 1.0));
-    angle = open ? 90.0f * progress : 90.0f * (1 - progress);
-  }
-  DrawTriangle(inParams, inRect, angle, inDrawbot);
+  // The triangle turns towards the press look (the down state): the button's
+  // value follows only when the twirl has ended.
+  const DrawTrianglePicture face(inParams, GetAnimationTime(), mTwirlDuration, GetDownState(), IsButtonCaptured(),
+                                 GetScale());
+  face(inParams.GetControlState(), inRect, PointF(), inDrawbot, *inParams.GetTheme(), inParams.GetColorChangeMap());
 }
 
 void UI_DisclosureTriangleButton::DrawTriangle(const DrawParameters& inParams, const RectF& inRect, float inAngle,

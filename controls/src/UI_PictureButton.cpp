@@ -3,6 +3,7 @@
 #include <cmath>
 
 #include "drawbot/Drawbot.h"
+#include "ui/KeyboardEvent.h"
 #include "tarsel/ThrowError.h"
 #include "ui/UI_NodeManager.h"
 
@@ -93,8 +94,26 @@ void UI_PictureButton::DrawPicture(const DrawParameters& inParams, const drawbot
                                     alpha);
 }
 
+bool UI_PictureButton::UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) {
+  if (mReturnActivates && !UI_IsDisabled() &&
+      inEvent.CompareShortcut(ui::KeyboardCode::CreateFromControlCode(ui::kControlCodeReturn), ui::kModKeyNone))
+    return HandleControlActivateViaKeyboard(inEvent);
+  return UI_Button::UI_DoKeyboardEvent(inTarget, inEvent);
+}
+
+void UI_PictureButton::Draw(const DrawPictureButtonParameters& inParams, drawbot::Drawbot& inDrawbot) {
+  if (!inParams.GetImage()) {
+    UI_Button::Draw(inParams, inDrawbot);
+    return;
+  }
+  const DrawButtonPicture face(inParams, *inParams.GetImage(), inParams.GetScale(), inParams.GetAlpha());
+  DrawPictureButtonParameters withFace(inParams);
+  withFace.SetDrawButtonFace(&face);
+  UI_Button::Draw(withFace, inDrawbot);
+}
+
 void UI_PictureButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
-  DrawButtonParameters params(this);
+  DrawPictureButtonParameters params(this);
   FillButtonParameters(params);
   const auto state = params.GetControlState();
   const bool border = ShouldDisplayBorderAlways() ||
@@ -103,13 +122,9 @@ void UI_PictureButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
   params.SetDrawOutline(border);
   params.SetDrawContainer(ShouldDisplayContainerAlways() || (border && !ShouldDisplayContainerNever()));
   if (GetDownState()) params.SetOffset(params.GetOffset() + GetDownOffset());
-  const drawbot::ImageInterface* image = FindImage(inDrawbot->GetSupplier());
-  if (!image) {
-    Draw(params, *inDrawbot);
-    return;
-  }
-  const DrawButtonPicture face(params, *image, mScale, mAlpha);
-  params.SetDrawButtonFace(&face);
+  params.SetImage(FindImage(inDrawbot->GetSupplier()));
+  params.SetScale(mScale);
+  params.SetAlpha(mAlpha);
   Draw(params, *inDrawbot);
 }
 

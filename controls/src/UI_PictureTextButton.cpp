@@ -1,5 +1,6 @@
 #include "controls/UI_PictureTextButton.h"
 
+#include <algorithm>
 #include <cmath>
 
 #include "drawbot/Drawbot.h"
@@ -29,13 +30,43 @@ void UI_PictureTextButton::SetScale(float inScale) {
   UI_Invalidate(nullptr, 0);
 }
 
+void UI_PictureTextButton::SetImageAndTextAlignment(drawbot::TextAlignment inAlignment) {
+  if (mBlockAlignment == inAlignment) return;
+  mBlockAlignment = inAlignment;
+  UI_Invalidate(nullptr, 0);
+}
+
+void UI_PictureTextButton::SetStyle(Style inStyle) {
+  if (mStyle == inStyle) return;
+  mStyle = inStyle;
+  UI_Invalidate(nullptr, 0);
+}
+
+// The block is the picture, the spacing and the label's measured width. Left
+// aligned it starts at the inset; centred or right aligned it moves across,
+// but never left of the inset. The label's rectangle always runs on to the
+// right edge, so a label drawn from its left end is never cut short.
 std::pair<ui::UI_Node::RectF, ui::UI_Node::RectF> UI_PictureTextButton::ComputeTextAndImageOffset(
     const RectF& inRect) const {
-  const float size = GetPictureSize();
-  const RectF picture(inRect.left + 2, std::floor(inRect.top + (inRect.height - size) / 2 + mVerticalOffset), size,
-                      size);
-  const float textLeft = picture.left + size + mSpacing;
-  return {picture, RectF(textLeft, inRect.top, std::max(0.0f, inRect.left + inRect.width - textLeft), inRect.height)};
+  constexpr float kInset = 2;
+  const bool picture = mStyle != kStyleTextOnly;
+  const bool text = mStyle != kStylePictureOnly;
+  const float size = picture ? GetPictureSize() : 0;
+  const float gap = picture && text ? mSpacing : 0;
+  float start = inRect.left + kInset;
+  if (mBlockAlignment != drawbot::kTextAlignLeft) {
+    DrawTextControlBaseParameters label;
+    FillTextParameters(label, UI_GetCurrentTheme().get());
+    const float block = size + gap + (text ? MeasureControlLabel(label, GetText()) : 0);
+    const float free = inRect.width - block;
+    start = std::max(start, inRect.left + (mBlockAlignment == drawbot::kTextAlignCenter ? std::floor(free / 2)
+                                                                                         : free - kInset));
+  }
+  const RectF pictureRect(start, std::floor(inRect.top + (inRect.height - size) / 2 + mVerticalOffset), size, size);
+  if (!text) return {pictureRect, RectF(inRect.left + inRect.width, inRect.top, 0, inRect.height)};
+  const float textLeft = start + size + gap;
+  return {pictureRect,
+          RectF(textLeft, inRect.top, std::max(0.0f, inRect.left + inRect.width - textLeft), inRect.height)};
 }
 
 void UI_PictureTextButton::DrawPicture(const DrawParameters&, const RectF&, drawbot::Drawbot&) {}
@@ -48,7 +79,7 @@ void UI_PictureTextButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
   // The bevel shows only while lit; the picture and label stand on it.
   params.SetText(UTF16String());
   UI_Button::Draw(params, *inDrawbot);
-  DrawPicture(params, picture, *inDrawbot);
+  if (picture.width > 0) DrawPicture(params, picture, *inDrawbot);
   DrawTextControlBaseParameters label(params);
   label.SetText(GetText());
   DrawControlLabel(params, label, text, *inDrawbot);
