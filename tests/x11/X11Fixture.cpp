@@ -2,7 +2,6 @@
 
 #include <cairo.h>
 #include <unistd.h>
-#include <xcb/xtest.h>
 
 #include <chrono>
 #include <cstdlib>
@@ -22,15 +21,17 @@ void X11Fixture::SetUp() {
   ASSERT_TRUE(mLayer) << "cannot open " << server->GetDisplayName();
   gCurrent = this;
   mLayer->SetWindowProcedure(&Procedure);
-  mUser = xcb_connect(server->GetDisplayName().c_str(), nullptr);
-  ASSERT_FALSE(xcb_connection_has_error(mUser));
+  mXTest = std::make_unique<XTestUser>(server->GetDisplayName());
+  ASSERT_TRUE(mXTest->IsConnected());
+  mUser = mXTest->GetConnection();
 }
 
 void X11Fixture::TearDown() {
   // Windows are destroyed with the layer; their last messages go nowhere.
   gCurrent = nullptr;
   mLayer.reset();
-  if (mUser) xcb_disconnect(mUser);
+  mXTest.reset();
+  mUser = nullptr;
 }
 
 std::intptr_t X11Fixture::Procedure(ui::OS_WindowHandle inWindow, unsigned inMessage, std::uintptr_t inWParam,
@@ -94,33 +95,12 @@ std::vector<RecordedMessage> X11Fixture::MessagesOf(unsigned inMessage) const {
   return result;
 }
 
-void X11Fixture::MovePointer(int inX, int inY) {
-  xcb_screen_t* screen = xcb_setup_roots_iterator(xcb_get_setup(mUser)).data;
-  xcb_test_fake_input(mUser, XCB_MOTION_NOTIFY, 0, XCB_CURRENT_TIME, screen->root, static_cast<int16_t>(inX),
-                      static_cast<int16_t>(inY), 0);
-  xcb_flush(mUser);
-}
+void X11Fixture::MovePointer(int inX, int inY) { mXTest->MovePointer(inX, inY); }
 
-void X11Fixture::Button(int inButton, bool inPress) {
-  xcb_test_fake_input(mUser, inPress ? XCB_BUTTON_PRESS : XCB_BUTTON_RELEASE, static_cast<uint8_t>(inButton),
-                      XCB_CURRENT_TIME, XCB_NONE, 0, 0, 0);
-  xcb_flush(mUser);
-}
+void X11Fixture::Button(int inButton, bool inPress) { mXTest->Button(inButton, inPress); }
 
 void X11Fixture::Key(std::uint32_t inKeysym, bool inPress) {
-  const xcb_setup_t* setup = xcb_get_setup(mUser);
-  const int count = setup->max_keycode - setup->min_keycode + 1;
-  xcb_get_keyboard_mapping_reply_t* map = xcb_get_keyboard_mapping_reply(
-      mUser, xcb_get_keyboard_mapping(mUser, setup->min_keycode, static_cast<uint8_t>(count)), nullptr);
-  ASSERT_NE(map, nullptr);
-  const xcb_keysym_t* syms = xcb_get_keyboard_mapping_keysyms(map);
-  xcb_keycode_t found = 0;
-  for (int i = 0; i < count && !found; ++i)
-    if (syms[i * map->keysyms_per_keycode] == inKeysym) found = static_cast<xcb_keycode_t>(setup->min_keycode + i);
-  std::free(map);
-  ASSERT_NE(found, 0) << "no key types keysym " << inKeysym;
-  xcb_test_fake_input(mUser, inPress ? XCB_KEY_PRESS : XCB_KEY_RELEASE, found, XCB_CURRENT_TIME, XCB_NONE, 0, 0, 0);
-  xcb_flush(mUser);
+  ASSERT_TRUE(mXTest->Key(inKeysym, inPress)) << "no key types keysym " << inKeysym;
 }
 
 std::uint32_t X11Fixture::ReadPixel(ui::OS_WindowHandle inWindow, int inX, int inY) {

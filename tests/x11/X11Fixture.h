@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "ui/OS_NativeLayer.h"
+#include "x11/XTestUser.h"
 
 namespace norvik::test {
 
@@ -48,7 +49,8 @@ class X11Fixture : public ::testing::Test {
                                  std::intptr_t inLParam);
 
   std::unique_ptr<ui::OS_NativeLayer> mLayer;
-  xcb_connection_t* mUser = nullptr;
+  std::unique_ptr<XTestUser> mXTest;
+  xcb_connection_t* mUser = nullptr;  // the user's connection, for requests of another client
   std::vector<RecordedMessage> mMessages;
   std::map<ui::OS_WindowHandle, std::uint32_t> mColors;
   // Runs for every message before the default handling; answers true to claim it.

@@ -72,6 +72,10 @@ struct X11Timer {
 
 class X11KeyboardLayout;
 
+// Whether a top level of these styles bypasses the window manager
+// (override-redirect).
+bool BypassesWindowManager(std::uint32_t inStyle, std::uint32_t inExStyle);
+
 class OS_NativeLayer_X11 : public OS_NativeLayer {
  public:
   // Connects to inDisplay (null: $DISPLAY). Throws the toolkit's exception when
@@ -185,6 +189,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   short GetKeyState(int inVirtualKey) const override;
   short GetAsyncKeyState(int inVirtualKey) const override;
   const KeyboardLayoutInterface* GetKeyboardLayout() const override;
+  // Through the keymap in force: the key's unshifted symbol in the active layout.
+  int ScanCodeToVirtualKey(unsigned inScanCode) const override;
 
   // ---- monitors and preferences ----
   std::vector<OS_Monitor> GetMonitors() const override;
@@ -208,9 +214,14 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void Connect(const char* inDisplay);
   void FindVisual();
   void ReadXSettings();
-  // windows (X11Windows.cpp)
+  // window manager hints (X11Hints.cpp)
   void ApplyTopLevelHints(X11Window& ioWindow);
+  void ApplyIcccmHints(X11Window& ioWindow);
+  void ApplySizeHints(X11Window& ioWindow);
   void ApplyWindowState(X11Window& ioWindow);
+  // After a style change: bypassing the window manager or not, and the hints.
+  void UpdateTopLevelKind(X11Window& ioWindow);
+  // windows (X11Windows.cpp)
   void DestroySubtree(OS_WindowHandle inWindow);
   // Sends the destroy messages to a window and its children and forgets them.
   void ForgetDestroyedWindow(OS_WindowHandle inWindow);
@@ -221,6 +232,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
                               std::intptr_t inLParam);
   void SendSize(OS_WindowHandle inWindow);
   void Configure(X11Window& ioWindow);
+  // To the top of its siblings, here and on the server.
+  void Raise(OS_WindowHandle inWindow);
   // events (X11Events.cpp)
   void DrainConnection();
   void TranslateEvent(xcb_generic_event_t* inEvent);

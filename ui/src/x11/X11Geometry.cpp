@@ -6,6 +6,8 @@
 namespace norvik::ui::x11 {
 
 void OS_NativeLayer_X11::Configure(X11Window& ioWindow) {
+  // A window manager holds a managed window to its size hints, so they move first.
+  if (ioWindow.parent == 0 && !ioWindow.overrideRedirect) ApplySizeHints(ioWindow);
   const std::uint32_t values[] = {static_cast<std::uint32_t>(static_cast<std::int32_t>(ioWindow.rect.left)),
                                   static_cast<std::uint32_t>(static_cast<std::int32_t>(ioWindow.rect.top)),
                                   static_cast<std::uint32_t>(std::max<long>(1, ioWindow.rect.width)),
@@ -78,6 +80,9 @@ void OS_NativeLayer_X11::ShowWindow(OS_WindowHandle inWindow, int inShowCommand)
       [[fallthrough]];
     default:
       window->style |= kOSStyleVisible;
+      // A popup that bypasses the window manager opens above everything
+      // else, even above windows made after it.
+      if (!wasVisible && window->overrideRedirect) Raise(inWindow);
       // The server answers a map with Expose, which becomes the first paint.
       if (!wasVisible || inShowCommand == kOSShowRestore || inShowCommand == kOSShowNormal)
         xcb_map_window(mConnection, window->id);
@@ -87,6 +92,16 @@ void OS_NativeLayer_X11::ShowWindow(OS_WindowHandle inWindow, int inShowCommand)
       break;
   }
   xcb_flush(mConnection);
+}
+
+void OS_NativeLayer_X11::Raise(OS_WindowHandle inWindow) {
+  X11Window* window = Find(inWindow);
+  if (!window) return;
+  auto& siblings = SiblingsOf(*window);
+  siblings.erase(std::remove(siblings.begin(), siblings.end(), inWindow), siblings.end());
+  siblings.insert(siblings.begin(), inWindow);
+  const std::uint32_t above = XCB_STACK_MODE_ABOVE;
+  xcb_configure_window(mConnection, window->id, XCB_CONFIG_WINDOW_STACK_MODE, &above);
 }
 
 bool OS_NativeLayer_X11::IsWindowVisible(OS_WindowHandle inWindow) const {

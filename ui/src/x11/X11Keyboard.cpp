@@ -139,6 +139,23 @@ void OS_NativeLayer_X11::LoadKeymap() {
 
 const KeyboardLayoutInterface* OS_NativeLayer_X11::GetKeyboardLayout() const { return mLayout.get(); }
 
+// Key messages carry the X keycode less 8 as their scan code (the kernel's key
+// number, which matches the hardware set-1 code on the main block). The key's
+// virtual key is that of its first-level symbol in the layout now in force, so
+// that a character typed with Ctrl reports the letter the layout puts there.
+int OS_NativeLayer_X11::ScanCodeToVirtualKey(unsigned inScanCode) const {
+  if (!mKeymap) return OS_NativeLayer::ScanCodeToVirtualKey(inScanCode);
+  if (inScanCode > 0xFFFF) return 0;
+  const xkb_keycode_t keycode = static_cast<xkb_keycode_t>(inScanCode) + 8;
+  if (keycode < xkb_keymap_min_keycode(mKeymap) || keycode > xkb_keymap_max_keycode(mKeymap)) return 0;
+  const xkb_layout_index_t layout =
+      mXkbState ? xkb_state_serialize_layout(mXkbState, XKB_STATE_LAYOUT_EFFECTIVE) : 0;
+  const xkb_keysym_t* syms = nullptr;
+  if (xkb_keymap_key_get_syms_by_level(mKeymap, keycode, layout, 0, &syms) < 1) return 0;
+  const int code = KeysymToVirtualKey(syms[0]).code;
+  return code != 0 ? code : OS_NativeLayer::ScanCodeToVirtualKey(inScanCode);
+}
+
 short OS_NativeLayer_X11::GetKeyState(int inVirtualKey) const {
   if (inVirtualKey < 0 || inVirtualKey > 255) return 0;
   const std::uint8_t s = mMessageKeyStates[static_cast<std::size_t>(inVirtualKey)];
@@ -171,6 +188,9 @@ void OS_NativeLayer_X11::TranslateKey(const xcb_key_press_event_t* inEvent, bool
   const bool keypad = effective >= XKB_KEY_KP_Space && effective <= XKB_KEY_KP_9;
   VirtualKey vk = KeysymToVirtualKey(keypad || plainCount < 1 ? effective : plain[0]);
   if (vk.code == 0) vk = KeysymToVirtualKey(effective);
+  // Dead keys and letters beyond ASCII (é on a French keyboard) have no key of
+  // their own: they take the key at the same place on a US keyboard.
+  if (vk.code == 0) vk.code = OS_NativeLayer::ScanCodeToVirtualKey(keycode - 8);
 
   const bool alt = (mods & XCB_MOD_MASK_1) != 0;
   const bool ctrl = (mods & XCB_MOD_MASK_CONTROL) != 0;

@@ -1,7 +1,5 @@
 // Windows: creation with their hints, destruction, the per-window state that X
 // does not keep, hierarchy and z-order.
-#include <unistd.h>
-
 #include <algorithm>
 #include <cstring>
 
@@ -23,12 +21,6 @@ constexpr std::uint32_t kEventMask =
     XCB_EVENT_MASK_FOCUS_CHANGE | XCB_EVENT_MASK_PROPERTY_CHANGE;
 
 bool IsChildStyle(std::uint32_t inStyle) { return (inStyle & kOSStyleChild) != 0; }
-
-// Popups without a caption (menus, tips, floating containers) bypass the
-// window manager, as such windows must appear at once and where asked.
-bool IsOverrideRedirect(std::uint32_t inStyle) {
-  return !IsChildStyle(inStyle) && (inStyle & kOSStylePopup) != 0 && (inStyle & kOSStyleCaption) != kOSStyleCaption;
-}
 
 }  // namespace
 
@@ -84,7 +76,7 @@ OS_WindowHandle OS_NativeLayer_X11::CreateWindow(const OS_WindowCreateParams& in
   window->owner = isChild ? 0 : inParams.parent;
   window->rect = inParams.rect;
   window->normalRect = inParams.rect;
-  window->overrideRedirect = IsOverrideRedirect(inParams.style);
+  window->overrideRedirect = !isChild && BypassesWindowManager(inParams.style, inParams.exStyle);
 
   const std::uint32_t mask = XCB_CW_BACK_PIXMAP | XCB_CW_BIT_GRAVITY | XCB_CW_OVERRIDE_REDIRECT | XCB_CW_EVENT_MASK;
   const std::uint32_t values[] = {XCB_BACK_PIXMAP_NONE, XCB_GRAVITY_NORTH_WEST,
@@ -129,49 +121,6 @@ OS_WindowHandle OS_NativeLayer_X11::CreateWindow(const OS_WindowCreateParams& in
   else if ((inParams.style & kOSStyleVisible) != 0)
     ShowWindow(handle, kOSShowNA);
   return Find(handle) ? handle : 0;
-}
-
-void OS_NativeLayer_X11::ApplyTopLevelHints(X11Window& ioWindow) {
-  const xcb_window_t id = ioWindow.id;
-  xcb_atom_t protocols[] = {Atom("WM_DELETE_WINDOW"), Atom("_NET_WM_PING")};
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("WM_PROTOCOLS"), XCB_ATOM_ATOM, 32, 2, protocols);
-  std::uint32_t pid = static_cast<std::uint32_t>(getpid());
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("_NET_WM_PID"), XCB_ATOM_CARDINAL, 32, 1, &pid);
-  if (ioWindow.owner != 0) {
-    xcb_window_t owner = static_cast<xcb_window_t>(ioWindow.owner);
-    xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, XCB_ATOM_WM_TRANSIENT_FOR, XCB_ATOM_WINDOW, 32, 1,
-                        &owner);
-  }
-  const char* type = "_NET_WM_WINDOW_TYPE_NORMAL";
-  if (ioWindow.overrideRedirect)
-    type = (ioWindow.exStyle & kOSExStyleTopmost) ? "_NET_WM_WINDOW_TYPE_POPUP_MENU" : "_NET_WM_WINDOW_TYPE_TOOLTIP";
-  else if (ioWindow.exStyle & kOSExStyleToolWindow)
-    type = "_NET_WM_WINDOW_TYPE_UTILITY";
-  else if (ioWindow.owner != 0 || (ioWindow.exStyle & kOSExStyleDialogModalFrame))
-    type = "_NET_WM_WINDOW_TYPE_DIALOG";
-  xcb_atom_t typeAtom = Atom(type);
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("_NET_WM_WINDOW_TYPE"), XCB_ATOM_ATOM, 32, 1,
-                      &typeAtom);
-  // Motif hints: decorations only for windows with a caption.
-  const bool decorated = (ioWindow.style & kOSStyleCaption) == kOSStyleCaption;
-  std::uint32_t motif[5] = {2, 0, decorated ? 1u : 0u, 0, 0};
-  xcb_atom_t motifAtom = Atom("_MOTIF_WM_HINTS");
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, motifAtom, motifAtom, 32, 5, motif);
-  ApplyWindowState(ioWindow);
-}
-
-// _NET_WM_STATE as set before mapping; the window manager reads it at map time.
-void OS_NativeLayer_X11::ApplyWindowState(X11Window& ioWindow) {
-  std::vector<xcb_atom_t> states;
-  if (ioWindow.exStyle & kOSExStyleTopmost) states.push_back(Atom("_NET_WM_STATE_ABOVE"));
-  if (ioWindow.exStyle & kOSExStyleDialogModalFrame) states.push_back(Atom("_NET_WM_STATE_MODAL"));
-  if (ioWindow.owner != 0) states.push_back(Atom("_NET_WM_STATE_SKIP_TASKBAR"));
-  if (ioWindow.maximized) {
-    states.push_back(Atom("_NET_WM_STATE_MAXIMIZED_VERT"));
-    states.push_back(Atom("_NET_WM_STATE_MAXIMIZED_HORZ"));
-  }
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, ioWindow.id, Atom("_NET_WM_STATE"), XCB_ATOM_ATOM, 32,
-                      static_cast<std::uint32_t>(states.size()), states.data());
 }
 
 void OS_NativeLayer_X11::DestroySubtree(OS_WindowHandle inWindow) {
@@ -292,7 +241,7 @@ void OS_NativeLayer_X11::SetStyle(OS_WindowHandle inWindow, std::uint32_t inStyl
   const std::uint32_t old = window->style;
   window->style = (inStyle & ~kOSStyleVisible) | (old & kOSStyleVisible);
   if ((old ^ inStyle) & kOSStyleVisible) ShowWindow(inWindow, (inStyle & kOSStyleVisible) ? kOSShowNA : kOSShowHide);
-  if (window->parent == 0 && !window->overrideRedirect) ApplyTopLevelHints(*window);
+  if (X11Window* still = Find(inWindow); still && still->parent == 0) UpdateTopLevelKind(*still);
 }
 
 std::uint32_t OS_NativeLayer_X11::GetExStyle(OS_WindowHandle inWindow) const {
@@ -304,7 +253,7 @@ void OS_NativeLayer_X11::SetExStyle(OS_WindowHandle inWindow, std::uint32_t inEx
   X11Window* window = Find(inWindow);
   if (!window) return;
   window->exStyle = inExStyle;
-  if (window->parent == 0) ApplyWindowState(*window);
+  if (window->parent == 0) UpdateTopLevelKind(*window);
 }
 
 std::vector<OS_WindowHandle> OS_NativeLayer_X11::EnumerateWindows() const {
