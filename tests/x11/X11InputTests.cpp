@@ -120,6 +120,22 @@ TEST_F(X11Input, ACaptureKeepsReceivingMotionOutsideTheWindowUntilReleased) {
   EXPECT_FALSE(Received(kOSMsgMouseMove)) << "without the capture, motion outside goes elsewhere";
 }
 
+TEST_F(X11Input, TheCursorPositionIsWhereThePointerIsOverOurWindowsAndElsewhere) {
+  MovePointer(150, 160);
+  ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgMouseMove); }));
+  EXPECT_EQ(mLayer->GetCursorPos(), OS_Point(150, 160));
+  MovePointer(151, 161);
+  ASSERT_TRUE(WaitFor([&] { return MessagesOf(kOSMsgMouseMove).size() >= 2; }));
+  EXPECT_EQ(mLayer->GetCursorPos(), OS_Point(151, 161));
+  // Outside our windows no motion is reported: the position comes from the server.
+  MovePointer(900, 700);
+  Settle(50);
+  EXPECT_EQ(mLayer->GetCursorPos(), OS_Point(900, 700));
+  MovePointer(910, 710);
+  Settle(50);
+  EXPECT_EQ(mLayer->GetCursorPos(), OS_Point(910, 710));
+}
+
 TEST_F(X11Input, LeavingATrackedWindowSendsOneMouseLeave) {
   MovePointer(150, 150);
   ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgMouseMove); }));

@@ -280,6 +280,7 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   OS_WindowHandle mCapture = 0;
   OS_WindowHandle mPointerWindow = 0;
   OS_Point mPointer;
+  bool mPointerInside = false;  // over one of our windows: mPointer is current
   OS_CursorHandle mCursor = 0;
   std::map<int, OS_CursorHandle> mSystemCursors;
   void* mCursorContext = nullptr;

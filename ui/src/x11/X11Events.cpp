@@ -44,7 +44,11 @@ OS_EventTime OS_NativeLayer_X11::GetTickCount() const {
   return std::chrono::duration_cast<std::chrono::milliseconds>(std::chrono::steady_clock::now() - mStart).count();
 }
 
+// While the pointer is over one of our windows, or grabbed, every motion is
+// reported to us, so the last event tells where it is without a round trip to
+// the server (which would cost more than the rest of a motion's handling).
 OS_Point OS_NativeLayer_X11::GetCursorPos() const {
+  if (mPointerInside || mCapture != 0) return mPointer;
   xcb_query_pointer_reply_t* reply =
       xcb_query_pointer_reply(mConnection, xcb_query_pointer(mConnection, mScreen->root), nullptr);
   if (!reply) return mPointer;
@@ -104,6 +108,7 @@ bool OS_NativeLayer_X11::ClickActivates(OS_WindowHandle inTarget, unsigned inMes
 void OS_NativeLayer_X11::TranslateButton(const xcb_button_press_event_t* inEvent, bool inPress) {
   const OS_Point screen(inEvent->root_x, inEvent->root_y);
   mPointer = screen;
+  mPointerInside = inEvent->same_screen != 0;
   const OS_WindowHandle target = MouseTarget(inEvent->event, screen);
   if (!target) return;
   const int xButton = inEvent->detail;
@@ -148,6 +153,7 @@ void OS_NativeLayer_X11::TranslateButton(const xcb_button_press_event_t* inEvent
 void OS_NativeLayer_X11::TranslateMotion(const xcb_motion_notify_event_t* inEvent) {
   const OS_Point screen(inEvent->root_x, inEvent->root_y);
   mPointer = screen;
+  mPointerInside = inEvent->same_screen != 0;
   const OS_WindowHandle target = MouseTarget(inEvent->event, screen);
   if (mCapture == 0) NotifyPointerWindow(target);
   if (!target) return;
@@ -159,11 +165,15 @@ void OS_NativeLayer_X11::TranslateMotion(const xcb_motion_notify_event_t* inEven
 void OS_NativeLayer_X11::TranslateCrossing(const xcb_enter_notify_event_t* inEvent, bool inEnter) {
   const OS_Point screen(inEvent->root_x, inEvent->root_y);
   mPointer = screen;
+  const X11Window* window = Find(inEvent->event);
+  if (inEnter)
+    mPointerInside = true;
+  else if (window && window->parent == 0 && inEvent->detail != XCB_NOTIFY_DETAIL_INFERIOR)
+    mPointerInside = false;
   if (inEvent->mode != XCB_NOTIFY_MODE_NORMAL || mCapture != 0) return;
   if (inEnter) {
     NotifyPointerWindow(MouseTarget(inEvent->event, screen));
-  } else if (inEvent->detail != XCB_NOTIFY_DETAIL_INFERIOR && Find(inEvent->event) &&
-             Find(inEvent->event)->parent == 0) {
+  } else if (inEvent->detail != XCB_NOTIFY_DETAIL_INFERIOR && window && window->parent == 0) {
     NotifyPointerWindow(0);  // left the top level altogether
   }
 }
