@@ -52,11 +52,6 @@ void GalleryPage::SetLight(bool inLight) {
   UI_Invalidate(nullptr, 0);
 }
 
-void GalleryPage::Paint(drawbot::Drawbot* inDrawbot) {
-  const ColorRGBA background = CurrentColors().background;
-  UI_DispatchDrawFromRoot(&background, inDrawbot, false);
-}
-
 SectionView* GalleryPage::GetSection(const char* inID) {
   for (auto& s : mSections)
     if (s->UI_GetNodeID() == inID) return s.get();
@@ -71,11 +66,6 @@ std::vector<ui::UI_Node*> GalleryPage::GetFocusTiles() const {
 
 bool GalleryPage::UI_AreAllParentsVisible() const {
   return UI_GetParentNode() ? UI_SubView::UI_AreAllParentsVisible() : UI_IsShown();
-}
-
-void GalleryPage::UI_Invalidate(const ui::UI_Node::RectL* inRect, unsigned long inFlags) {
-  UI_SubView::UI_Invalidate(inRect, inFlags);
-  if (mInvalidate && !UI_GetParentNode()) mInvalidate(inRect);
 }
 
 void GalleryPage::UI_SizeChanged(const RectF& inLocalRect) {
@@ -107,8 +97,7 @@ void GalleryPage::Arrange() {
 }
 
 void GalleryPage::UI_Draw(drawbot::Drawbot* inDrawbot) {
-  // Called only when the page is nested in another tree; as the root of the
-  // traversal, Paint's background stands for it.
+  // The page covers its window: every pixel gets the page's background.
   const GalleryColors c = CurrentColors();
   FillRect(inDrawbot, UI_GetLocalRectF(false), c.background);
   UI_SubView::UI_Draw(inDrawbot);

@@ -3,8 +3,6 @@
 // the title and the brightness switch, then one panel per section. The page
 // owns its look: switching between dark and light sets the theme's
 // brightness, tells the theme's clients, and repaints.
-#include <functional>
-
 #include "GalleryViews.h"
 #include "ui/KeyframeThemeEditor.h"
 
@@ -12,20 +10,11 @@ namespace norvik::gallery {
 
 class GalleryPage : public ui::UI_SubView {
  public:
-  using InvalidateFunction = std::function<void(const ui::UI_Node::RectL* inRect)>;
-
   // The page paints with inTheme, which the caller has made the default theme.
   GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight);
 
   void SetLight(bool inLight);
   bool IsLight() const { return mLight; }
-
-  // Paints the whole page onto inDrawbot's surface, background first.
-  void Paint(drawbot::Drawbot* inDrawbot);
-
-  // Told of every invalidation that reaches the page (local rectangle, or
-  // null for all of it): the window showing the page repaints from it.
-  void SetInvalidateFunction(InvalidateFunction inF) { mInvalidate = std::move(inF); }
 
   BrightnessSwitch* GetBrightnessSwitch() const { return mSwitch.get(); }
   SectionView* GetSection(const char* inID);
@@ -35,7 +24,6 @@ class GalleryPage : public ui::UI_SubView {
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
   // As the root of a window's contents, the page is visible when shown.
   bool UI_AreAllParentsVisible() const override;
-  void UI_Invalidate(const ui::UI_Node::RectL* inRect, unsigned long inFlags) override;
   void UI_SizeChanged(const RectF& inLocalRect) override;
 
   static constexpr float kHeaderHeight = 48;
@@ -48,7 +36,6 @@ class GalleryPage : public ui::UI_SubView {
   void Arrange();
   ui::KeyframeThemeEditorP mTheme;
   bool mLight;
-  InvalidateFunction mInvalidate;
   ui::UI_NodeP mHeader;
   boost::intrusive_ptr<BrightnessSwitch> mSwitch;
   std::vector<boost::intrusive_ptr<SectionView>> mSections;

@@ -1,47 +1,44 @@
 #pragma once
-// Shows a gallery page in a top-level native window of any native layer
-// (the X11 one or the headless one): paints the page into the window's
-// paint surface, turns mouse and key messages into node events, resizes the
-// page with the window, and quits the loop when the window is closed.
-#include <cstdint>
+// The gallery's main window: a top-level view container of the toolkit with
+// the page as its one child. Everything a user does reaches the page through
+// the toolkit's own window bridge (mouse, keys, capture, focus, Tab, timers,
+// hover, painting); the window only makes the container a main window, lays
+// the page out when the client area changes size, and ends the loop when the
+// native window is closed. It works on whatever native layer is installed:
+// the X11 one on a display, the headless one for screenshots and tests.
+#include <functional>
 
 #include "GalleryPage.h"
-#include "ui/ModifierKeys.h"
-#include "ui/OS_NativeLayer.h"
+#include "ui/OS_ViewContainer.h"
 
 namespace norvik::gallery {
 
-class GalleryWindow {
- public:
-  // Creates and shows the window, inWidth x inHeight client pixels, titled
-  // with the gallery's title. The layer must be installed.
-  GalleryWindow(ui::OS_NativeLayer& inLayer, GalleryPageP inPage, long inWidth, long inHeight);
-  // Destroys the window if it is still open.
-  ~GalleryWindow();
-  GalleryWindow(const GalleryWindow&) = delete;
-  GalleryWindow& operator=(const GalleryWindow&) = delete;
+class GalleryWindow;
+using GalleryWindowP = boost::intrusive_ptr<GalleryWindow>;
 
-  ui::OS_WindowHandle GetHandle() const { return mHandle; }
-  bool IsOpen() const { return mHandle != 0; }
+class GalleryWindow : public ui::OS_TopLevelViewContainer {
+ public:
+  // Creates the window with inWidth x inHeight client pixels, titled with the
+  // gallery's title, puts inPage in it, shows and activates it. A native
+  // layer must be installed.
+  GalleryWindow(GalleryPageP inPage, long inWidth, long inHeight);
+
+  bool IsOpen() const { return GetHandle() != 0; }
   GalleryPage& GetPage() const { return *mPage; }
-  // Paints whatever is damaged now.
-  void Update();
-  // Runs the layer's loop until the window closes; answers the exit code.
+  // Runs the layer's loop until the window closes (or someone quits the
+  // loop); answers the exit code. Answers 0 at once when already closed.
   int Run();
+  // Called once, after the first paint of the shown window has been handed
+  // to the platform.
+  void SetFirstFrameFunction(std::function<void()> inF) { mFirstFrame = std::move(inF); }
+
+  void UI_SizeChanged(const RectF& inLocalRect) override;
+  bool UI_Paint(ui::OS_Event* inEvent) override;
+  void UI_PostClose() override;
 
  private:
-  static std::intptr_t Procedure(ui::OS_WindowHandle inWindow, unsigned inMessage, std::uintptr_t inWParam,
-                                 std::intptr_t inLParam);
-  std::intptr_t Handle(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
-  void Paint();
-  void MouseMessage(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
-  ui::ModifierKeys CurrentModifiers() const;
-  void KeyMessage(unsigned inMessage, std::uintptr_t inWParam, std::intptr_t inLParam);
-
-  ui::OS_NativeLayer& mLayer;
   GalleryPageP mPage;
-  ui::OS_WindowHandle mHandle = 0;
-  bool mTrackingLeave = false;
+  std::function<void()> mFirstFrame;
 };
 
 }  // namespace norvik::gallery

@@ -35,10 +35,10 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
   int result = gallery::kExitOK;
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
-    gallery::GalleryWindow window(system.GetLayer(), page, inOptions.width, inOptions.height);
+    gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
     system.Pump();
-    window.Update();
-    if (!system.WriteWindowPNG(window.GetHandle(), inPath)) {
+    window->UI_UpdateNow();
+    if (!system.WriteWindowPNG(window->GetHandle(), inPath)) {
       std::fprintf(stderr, "%s\n", Say("$$$/norvik/gallery/Error/WritePNG=Could not write the image ^0.", inPath).c_str());
       result = gallery::kExitFailure;
     } else {
@@ -56,8 +56,8 @@ int ShowOnDisplay(ui::OS_NativeLayer& inLayer, const gallery::GalleryOptions& in
   int result = gallery::kExitOK;
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
-    gallery::GalleryWindow window(inLayer, page, inOptions.width, inOptions.height);
-    result = window.Run();
+    gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
+    result = window->Run();
   }
   ui::InstallNativeLayer(nullptr);
   return result;

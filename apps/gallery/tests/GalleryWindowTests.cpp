@@ -37,7 +37,7 @@ class GalleryWindowTest : public ::testing::Test {
     ui::Theme::Initialize(theme);
     system.Install();
     page.reset(new GalleryPage(theme, inLight));
-    window = std::make_unique<GalleryWindow>(system.GetLayer(), page, inWidth, inHeight);
+    window.reset(new GalleryWindow(page, inWidth, inHeight));
     system.Pump();
   }
   void TearDown() override {
@@ -51,11 +51,18 @@ class GalleryWindowTest : public ::testing::Test {
     system.Pump();
     return system.ReadWindowPixels(window->GetHandle());
   }
+  // A rectangle of a node in the window's client coordinates (the page fills
+  // the client area). Global coordinates of nodes in a window are the screen's.
+  ui::UI_Node::RectL InWindow(const ui::UI_Node* inNode, const ui::UI_Node::RectL& inLocal) {
+    const ui::UI_Node::RectL onScreen = inNode->UI_LocalToGlobal(inLocal);
+    const ui::OS_Point origin = system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(0, 0));
+    return ui::UI_Node::RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
+  }
   // The centre of a node, in screen coordinates.
   ui::OS_Point ScreenCentre(const ui::UI_Node* inNode) {
     const RectF local = inNode->UI_GetLocalRectF(false);
-    const ui::UI_Node::RectL onPage = inNode->UI_LocalToGlobal(ui::UI_Node::RectL(
-        0, 0, static_cast<long>(local.width), static_cast<long>(local.height)));
+    const ui::UI_Node::RectL onPage =
+        InWindow(inNode, ui::UI_Node::RectL(0, 0, static_cast<long>(local.width), static_cast<long>(local.height)));
     return system.GetLayer().ClientToScreen(
         window->GetHandle(), ui::OS_Point(onPage.left + onPage.width / 2, onPage.top + onPage.height / 2));
   }
@@ -76,7 +83,7 @@ class GalleryWindowTest : public ::testing::Test {
   ui::HeadlessWindowSystem system;
   ui::KeyframeThemeEditorP theme;
   GalleryPageP page;
-  std::unique_ptr<GalleryWindow> window;
+  GalleryWindowP window;
 };
 
 TEST_F(GalleryWindowTest, TheDarkLookPaintsADarkPageWithLightTitleText) {
@@ -165,7 +172,7 @@ TEST_F(GalleryWindowTest, ClickingATileFocusesItAndDrawsTheRingAroundIt) {
   Open(false);
   ui::UI_Node* timeline = page->GetFocusTiles()[2];
   const RectF r = timeline->UI_GetLocalRectF(false);
-  const ui::UI_Node::RectL onPage = timeline->UI_LocalToGlobal(ui::UI_Node::RectL(0, 0, 1, 1));
+  const ui::UI_Node::RectL onPage = InWindow(timeline, ui::UI_Node::RectL(0, 0, 1, 1));
   // A pixel of the ring: on the tile's left edge, half way down.
   const int ringX = static_cast<int>(onPage.left), ringY = static_cast<int>(onPage.top + r.height / 2);
   const std::uint32_t before = Pixels().At(ringX, ringY);
@@ -196,7 +203,7 @@ TEST_F(GalleryWindowTest, TheControlsTakeClicksThroughTheWindow) {
   ui::UI_Node* samples = (group->ChildBegin() + 2)->get();
   system.AdvanceClock(1000);
   // On the round button at the left end of the radio.
-  const ui::UI_Node::RectL onPage = samples->UI_LocalToGlobal(ui::UI_Node::RectL(6, 9, 1, 1));
+  const ui::UI_Node::RectL onPage = InWindow(samples, ui::UI_Node::RectL(6, 9, 1, 1));
   system.Click(system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(onPage.left, onPage.top)));
   system.AdvanceClock(100);
   EXPECT_EQ(group->GetIndex(), 2);
