@@ -37,6 +37,8 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
     const std::string& arg = inArgs[i];
     if (arg == "--help" || arg == "-h") {
       outOptions.help = true;
+    } else if (arg == "--exit-after-first-frame") {
+      outOptions.exitAfterFirstFrame = true;
     } else if (arg == "--light" || arg == "--dark") {
       const bool light = arg == "--light";
       if (sawLook && light != outOptions.light) {
@@ -84,6 +86,7 @@ std::string GalleryUsage() {
       "  --light            start in the light look\n"
       "  --dark             start in the dark look (the default)\n"
       "  --size WxH         client size of the window in pixels (default 1120x720)\n"
+      "  --exit-after-first-frame  exit once the first frame is shown, printing the time it took\n"
       "  --help             show this text\n");
 }
 

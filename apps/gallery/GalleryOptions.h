@@ -11,6 +11,9 @@ struct GalleryOptions {
   long width = 1120;
   long height = 720;
   bool help = false;
+  // Quit once the window's first frame is on the screen, printing how long
+  // the program took to get there.
+  bool exitAfterFirstFrame = false;
 };
 
 // Exit codes of the program.

@@ -1,6 +1,7 @@
 // The gallery: the toolkit's own program, one window whose page shows what
 // the toolkit can do. With --screenshot, or where no display opens, it
 // renders the page through the headless window system to a PNG and exits.
+#include <chrono>
 #include <cstdio>
 #include <exception>
 #include <memory>
@@ -28,6 +29,18 @@ std::string Say(std::string_view inKey, const std::string& inValue = std::string
   return text;
 }
 
+// Taken while the program's static objects are made, before main runs: the
+// start from which the time to the first frame is told.
+const std::chrono::steady_clock::time_point kProgramStart = std::chrono::steady_clock::now();
+
+void ReportFirstFrame() {
+  const double ms = std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now() - kProgramStart).count();
+  char value[32];
+  std::snprintf(value, sizeof value, "%.1f", ms);
+  std::printf("%s\n", Say("$$$/norvik/gallery/FirstFrame=First frame after ^0 ms.", value).c_str());
+  std::fflush(stdout);
+}
+
 // Renders the page in a headless window and writes the window's pixels.
 int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEditorP inTheme, const std::string& inPath) {
   ui::HeadlessWindowSystem system;
@@ -36,6 +49,7 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
     gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
+    if (inOptions.exitAfterFirstFrame) window->SetFirstFrameFunction(&ReportFirstFrame);
     system.Pump();
     window->UI_UpdateNow();
     if (!system.WriteWindowPNG(window->GetHandle(), inPath)) {
@@ -49,7 +63,8 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
   return result;
 }
 
-// Shows the page in a window on the display until the window is closed.
+// Shows the page in a window on the display until the window is closed, or
+// until its first frame is shown when that is all that was asked.
 int ShowOnDisplay(ui::OS_NativeLayer& inLayer, const gallery::GalleryOptions& inOptions,
                   ui::KeyframeThemeEditorP inTheme) {
   ui::InstallNativeLayer(&inLayer);
@@ -57,6 +72,11 @@ int ShowOnDisplay(ui::OS_NativeLayer& inLayer, const gallery::GalleryOptions& in
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
     gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
+    if (inOptions.exitAfterFirstFrame)
+      window->SetFirstFrameFunction([&inLayer] {
+        ReportFirstFrame();
+        inLayer.QuitLoop(gallery::kExitOK);
+      });
     result = window->Run();
   }
   ui::InstallNativeLayer(nullptr);

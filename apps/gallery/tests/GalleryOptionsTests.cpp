@@ -37,6 +37,15 @@ TEST(GalleryOptions, ScreenshotLookAndSizeAreRead) {
   EXPECT_EQ(p.options.height, 600);
 }
 
+TEST(GalleryOptions, ExitAfterFirstFrameIsOffUnlessAsked) {
+  EXPECT_FALSE(Parse({}).options.exitAfterFirstFrame);
+  Parsed p = Parse({"--exit-after-first-frame", "--light"});
+  ASSERT_TRUE(p.ok) << p.error;
+  EXPECT_TRUE(p.options.exitAfterFirstFrame);
+  EXPECT_TRUE(p.options.light);
+  EXPECT_FALSE(Parse({"--exit-after-first-frame=1"}).ok) << "the option takes no value";
+}
+
 TEST(GalleryOptions, HelpIsRecognisedInItsShortAndLongForms) {
   EXPECT_TRUE(Parse({"--help"}).options.help);
   EXPECT_TRUE(Parse({"-h"}).options.help);

@@ -76,10 +76,24 @@ TEST_F(GalleryProgram, TheTwoLooksGiveDifferentImages) {
   EXPECT_NE(darkBytes, lightBytes);
 }
 
+TEST_F(GalleryProgram, ExitAfterFirstFrameTellsTheTimeToTheFirstFrame) {
+  const std::string path = (dir / "first.png").string();
+  ProgramRun run = RunGallery("--exit-after-first-frame --screenshot '" + path + "'");
+  EXPECT_EQ(run.exitCode, 0) << run.output;
+  const std::string prefix = "First frame after ";
+  const std::size_t at = run.output.find(prefix);
+  ASSERT_NE(at, std::string::npos) << run.output;
+  const double ms = std::strtod(run.output.c_str() + at + prefix.size(), nullptr);
+  EXPECT_GT(ms, 0.0) << run.output;
+  EXPECT_NE(run.output.find(" ms.", at), std::string::npos) << run.output;
+  unsigned w = 0, h = 0;
+  EXPECT_TRUE(ReadPNGSize(path, w, h)) << "the image is still written";
+}
+
 TEST_F(GalleryProgram, HelpPrintsTheOptionsAndExitsZero) {
   ProgramRun run = RunGallery("--help");
   EXPECT_EQ(run.exitCode, 0);
-  for (const char* option : {"--screenshot", "--light", "--dark", "--size", "--help"})
+  for (const char* option : {"--screenshot", "--light", "--dark", "--size", "--exit-after-first-frame", "--help"})
     EXPECT_NE(run.output.find(option), std::string::npos) << option;
 }
 

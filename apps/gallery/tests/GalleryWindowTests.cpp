@@ -250,6 +250,63 @@ TEST_F(GalleryWindowTest, ClosingTheWindowEndsTheLoopAndTheWindowIsGone) {
   window.reset();  // destroying the object after the window is gone is harmless
 }
 
+TEST_F(GalleryWindowTest, TheWindowIsAnActiveMainWindowWithTheGalleryTitleAndThePageFillsIt) {
+  Open(false, 800, 500);
+  ui::OS_NativeLayer& layer = system.GetLayer();
+  const ui::OS_WindowHandle handle = window->GetHandle();
+  EXPECT_EQ(layer.GetWindowText(handle), u"norvik gallery");
+  EXPECT_EQ(layer.GetActiveWindow(), handle);
+  EXPECT_EQ(layer.GetExStyle(handle) & ui::kOSExStyleNoActivate, 0u) << "a main window takes activation";
+  EXPECT_EQ(layer.GetStyle(handle) & ui::kOSStylePopup, 0u);
+  EXPECT_EQ(layer.GetClientRect(handle), ui::OS_Rect(0, 0, 800, 500));
+  EXPECT_EQ(page->UI_GetParentNode(), window.get());
+  EXPECT_EQ(page->UI_GetLocalRectF(true), RectF(0, 0, 800, 500));
+}
+
+TEST_F(GalleryWindowTest, AButtonPressedAndReleasedOutsideItDoesNothingWhilePressAndReleaseOnItReports) {
+  Open(false, 1120, 720);
+  auto* view = static_cast<ControlsView*>(page->GetSection("section-controls")->UI_ChildGetFromID("controls"));
+  ASSERT_NE(view, nullptr);
+  const UTF16String hint = view->GetStatus();
+  // The button holds the mouse from the press: the release far outside the
+  // window still reaches it, and it lets go without reporting.
+  system.MovePointer(ScreenCentre(view->GetRenderButton()));
+  system.PressButton(ui::kHeadlessButtonLeft);
+  system.Pump();
+  EXPECT_EQ(system.GetLayer().GetCapture(), window->GetHandle()) << "the press captured the mouse";
+  system.MovePointer(ui::OS_Point(3000, 3000));
+  system.ReleaseButton(ui::kHeadlessButtonLeft);
+  system.Pump();
+  EXPECT_EQ(view->GetStatus(), hint);
+  EXPECT_EQ(system.GetLayer().GetCapture(), 0u) << "the release let the mouse go";
+  system.AdvanceClock(1000);
+  Click(view->GetRenderButton());
+  EXPECT_NE(view->GetStatus(), hint);
+}
+
+TEST_F(GalleryWindowTest, TheFirstFrameIsReportedOnceAfterTheShownWindowPaints) {
+  theme = ui::MakeDefaultKeyframeTheme();
+  ui::Theme::Initialize(theme);
+  system.Install();
+  page.reset(new GalleryPage(theme, false));
+  window.reset(new GalleryWindow(page, 900, 600));
+  int frames = 0;
+  std::uint32_t pixelThen = 0;
+  window->SetFirstFrameFunction([&] {
+    ++frames;
+    pixelThen = system.ReadWindowPixels(window->GetHandle()).At(4, 300);
+  });
+  EXPECT_EQ(frames, 0) << "nothing is painted before the loop runs";
+  system.Pump();
+  EXPECT_EQ(frames, 1);
+  EXPECT_LT(Luma(pixelThen), 0x50) << "the page was on the window when the frame was reported";
+  EXPECT_NE(pixelThen, 0u);
+  page->SetLight(true);
+  system.Pump();
+  EXPECT_EQ(frames, 1) << "later paints are not first frames";
+  EXPECT_GT(Luma(Pixels().At(4, 300)), 0xC0);
+}
+
 TEST_F(GalleryWindowTest, EverySectionHasATitleAndContentInsideIt) {
   Open(false);
   for (const char* id : {"section-colours", "section-drawing", "section-tree", "section-focus", "section-controls"}) {
