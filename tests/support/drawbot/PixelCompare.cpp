@@ -85,7 +85,6 @@ bool SavePNG(PixelImage const& inImage, std::string const& inPath) {
   std::filesystem::path outDir = std::filesystem::path(NORVIK_TEST_OUTPUT_DIR);
   std::filesystem::create_directories((outDir / inName).parent_path());
   std::string actualPath = (outDir / (inName + "-actual.png")).string();
-  std::string diffPath = (outDir / (inName + "-diff.png")).string();
 
   PixelImage reference;
   if (!LoadPNG(referencePath, &reference)) {
@@ -98,10 +97,20 @@ bool SavePNG(PixelImage const& inImage, std::string const& inPath) {
     SavePNG(inActual, actualPath);
     return ::testing::AssertionFailure() << "no reference image " << referencePath << "; actual in " << actualPath;
   }
-  if (reference.width != inActual.width || reference.height != inActual.height) {
+  return MatchesImage(inActual, reference, inName, inTolerance);
+}
+
+::testing::AssertionResult MatchesImage(PixelImage const& inActual, PixelImage const& inExpected,
+                                        std::string const& inName, int inTolerance) {
+  std::filesystem::path outDir = std::filesystem::path(NORVIK_TEST_OUTPUT_DIR);
+  std::filesystem::create_directories((outDir / inName).parent_path());
+  std::string actualPath = (outDir / (inName + "-actual.png")).string();
+  std::string expectedPath = (outDir / (inName + "-expected.png")).string();
+  std::string diffPath = (outDir / (inName + "-diff.png")).string();
+  if (inExpected.width != inActual.width || inExpected.height != inActual.height) {
     SavePNG(inActual, actualPath);
     return ::testing::AssertionFailure() << "size " << inActual.width << "x" << inActual.height << " differs from "
-                                         << reference.width << "x" << reference.height;
+                                         << inExpected.width << "x" << inExpected.height;
   }
   PixelImage diff{inActual.width, inActual.height, std::vector<std::uint32_t>(inActual.pixels.size(), 0xff000000u)};
   long bad = 0;
@@ -110,7 +119,7 @@ bool SavePNG(PixelImage const& inImage, std::string const& inPath) {
     int largest = 0;
     for (int shift = 0; shift < 32; shift += 8) {
       int a = static_cast<int>((inActual.pixels[i] >> shift) & 0xff);
-      int b = static_cast<int>((reference.pixels[i] >> shift) & 0xff);
+      int b = static_cast<int>((inExpected.pixels[i] >> shift) & 0xff);
       largest = std::max(largest, std::abs(a - b));
     }
     worst = std::max(worst, largest);
@@ -121,10 +130,11 @@ bool SavePNG(PixelImage const& inImage, std::string const& inPath) {
   }
   if (bad == 0) return ::testing::AssertionSuccess();
   SavePNG(inActual, actualPath);
+  SavePNG(inExpected, expectedPath);
   SavePNG(diff, diffPath);
-  return ::testing::AssertionFailure() << bad << " pixels differ from " << referencePath << " by more than "
-                                       << inTolerance << " (worst " << worst << "); see " << actualPath << " and "
-                                       << diffPath;
+  return ::testing::AssertionFailure() << bad << " pixels of " << inName << " differ by more than " << inTolerance
+                                       << " (worst " << worst << "); see " << actualPath << ", " << expectedPath
+                                       << " and " << diffPath;
 }
 
 }  // namespace norvik::drawbot::testing

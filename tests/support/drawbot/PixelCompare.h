@@ -54,4 +54,10 @@ bool SavePNG(PixelImage const& inImage, std::string const& inPath);
 ::testing::AssertionResult MatchesReference(PixelImage const& inActual, std::string const& inName,
                                             int inTolerance = 2);
 
+// Compares two images of one size, allowing each channel to differ by
+// inTolerance. On a difference writes <inName>-actual.png, -expected.png and
+// -diff.png (differing pixels in red) to the test output folder.
+::testing::AssertionResult MatchesImage(PixelImage const& inActual, PixelImage const& inExpected,
+                                        std::string const& inName, int inTolerance = 2);
+
 }  // namespace norvik::drawbot::testing

@@ -1,0 +1,215 @@
+// The gallery's window on a real X server: a click sent through XTEST reaches
+// a control of the page through the toolkit's window bridge, the pixels the
+// server shows are those of the headless rendering of the same page, and the
+// program itself starts, shows its first frame and exits on the display.
+#include <sys/wait.h>
+#include <xcb/xcb.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+
+#include "ControlsView.h"
+#include "GalleryPage.h"
+#include "GalleryWindow.h"
+#include "controls/ControlMessages.h"
+#include "controls/UI_Checkbox.h"
+#include "controls/UI_TextButton.h"
+#include "support/drawbot/PixelCompare.h"
+#include "support/ui/XvfbServer.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/OS_NodeManager.h"
+#include "ui/Theme.h"
+#include "x11/X11Fixture.h"
+
+namespace norvik::test {
+namespace {
+
+using drawbot::testing::PixelImage;
+
+// Inside the 1024x768 screen of the test server, with every control in view.
+constexpr long kWidth = 940;
+constexpr long kHeight = 660;
+
+class GalleryOnX11 : public X11Fixture {
+ protected:
+  void SetUp() override {
+    X11Fixture::SetUp();
+    if (IsSkipped() || HasFatalFailure()) return;
+    ui::InstallNativeLayer(mLayer.get());
+    mInstalled = true;
+    mTheme = ui::MakeDefaultKeyframeTheme();
+    ui::Theme::Initialize(mTheme);
+    // The pointer away from the window, so that nothing on the page is hovered.
+    MovePointer(1020, 764);
+    mPage.reset(new gallery::GalleryPage(mTheme, false));
+    mWindow.reset(new gallery::GalleryWindow(mPage, kWidth, kHeight));
+    bool painted = false;
+    mWindow->SetFirstFrameFunction([&painted] { painted = true; });
+    ASSERT_TRUE(WaitFor([&] { return painted; })) << "the window never painted";
+    Settle(100);
+  }
+  void TearDown() override {
+    mWindow.reset();
+    mPage.reset();
+    if (mInstalled) {
+      ui::InstallNativeLayer(nullptr);
+      ui::Theme::Terminate();
+    }
+    X11Fixture::TearDown();
+  }
+
+  // The centre of a node, in screen coordinates.
+  ui::OS_Point ScreenCentre(const ui::UI_Node* inNode) const {
+    const ui::UI_Node::RectF local = inNode->UI_GetLocalRectF(false);
+    const ui::UI_Node::RectL onScreen = inNode->UI_LocalToGlobal(
+        ui::UI_Node::RectL(0, 0, static_cast<long>(local.width), static_cast<long>(local.height)));
+    return ui::OS_Point(onScreen.left + onScreen.width / 2, onScreen.top + onScreen.height / 2);
+  }
+  void ClickAt(ui::OS_Point inScreen) {
+    MovePointer(static_cast<int>(inScreen.x), static_cast<int>(inScreen.y));
+    Settle(30);
+    Button(1, true);
+    Settle(30);
+    Button(1, false);
+  }
+  gallery::ControlsView* Controls() const {
+    return static_cast<gallery::ControlsView*>(
+        mPage->GetSection("section-controls")->UI_ChildGetFromID("controls"));
+  }
+  // Counts the change messages of a control from now on.
+  controls::ControlChangedFunctionP CountChanges(int& outCount, ui::UI_Node*& outSender) {
+    return controls::ControlChangedFunctionP(new controls::ControlChangedFunction(
+        [&outCount, &outSender](controls::UI_ControlChangedMessage* inMessage) {
+          ++outCount;
+          outSender = inMessage->GetControl();
+        }));
+  }
+
+  // The window's client area as the server shows it, as opaque 0xAARRGGBB.
+  PixelImage ReadWindowFromServer() {
+    PixelImage image;
+    xcb_get_image_reply_t* reply = xcb_get_image_reply(
+        mUser,
+        xcb_get_image(mUser, XCB_IMAGE_FORMAT_Z_PIXMAP, static_cast<xcb_drawable_t>(mWindow->GetHandle()), 0, 0,
+                      static_cast<std::uint16_t>(kWidth), static_cast<std::uint16_t>(kHeight), ~0u),
+        nullptr);
+    if (!reply) return image;
+    const int length = xcb_get_image_data_length(reply);
+    if (length >= kWidth * kHeight * 4) {
+      const auto* data = reinterpret_cast<const std::uint32_t*>(xcb_get_image_data(reply));
+      image.width = static_cast<int>(kWidth);
+      image.height = static_cast<int>(kHeight);
+      image.pixels.reserve(static_cast<std::size_t>(kWidth * kHeight));
+      for (long i = 0; i < kWidth * kHeight; ++i) image.pixels.push_back(0xFF000000u | (data[i] & 0xFFFFFFu));
+    }
+    std::free(reply);
+    return image;
+  }
+
+  // The same page at the same size, rendered by the headless window system
+  // while it stands in for the display; the display comes back afterwards.
+  PixelImage RenderHeadless() {
+    PixelImage image;
+    {
+      ui::HeadlessWindowSystem system;
+      system.Install();
+      {
+        gallery::GalleryPageP page(new gallery::GalleryPage(mTheme, false));
+        gallery::GalleryWindowP window(new gallery::GalleryWindow(page, kWidth, kHeight));
+        system.Pump();
+        const ui::HeadlessPixels pixels = system.ReadWindowPixels(window->GetHandle());
+        image.width = pixels.width;
+        image.height = pixels.height;
+        image.pixels = pixels.pixels;
+      }
+      system.Uninstall();
+    }
+    ui::InstallNativeLayer(mLayer.get());
+    return image;
+  }
+
+  ui::OS_NodeManager mManager;
+  ui::KeyframeThemeEditorP mTheme;
+  gallery::GalleryPageP mPage;
+  gallery::GalleryWindowP mWindow;
+  bool mInstalled = false;
+};
+
+TEST_F(GalleryOnX11, AClickThroughXTestOnTheRenderButtonSendsItsChangeMessage) {
+  controls::UI_TextButton* render = Controls()->GetRenderButton();
+  int changes = 0;
+  ui::UI_Node* sender = nullptr;
+  render->NotifyWhenChanged(CountChanges(changes, sender));
+  const ui::OS_Point at = ScreenCentre(render);
+  ASSERT_TRUE(ui::OS_Rect(60, 60, kWidth, kHeight).Contains(at)) << "the button is in the window";
+  ClickAt(at);
+  ASSERT_TRUE(WaitFor([&] { return changes > 0; })) << "no change message from the button";
+  EXPECT_EQ(changes, 1);
+  EXPECT_EQ(sender, render);
+  EXPECT_NE(Controls()->GetStatus().find(u"Render"), UTF16String::npos);
+  EXPECT_EQ(mLayer->GetCapture(), 0u) << "the release ended the button's capture";
+}
+
+TEST_F(GalleryOnX11, AClickOnTheCheckboxTogglesItAndAClickBesideTheWindowDoesNot) {
+  controls::UI_Checkbox* snap = Controls()->GetSnapCheckbox();
+  ASSERT_TRUE(snap->IsChecked());
+  int changes = 0;
+  ui::UI_Node* sender = nullptr;
+  snap->NotifyWhenChanged(CountChanges(changes, sender));
+  ClickAt(ui::OS_Point(1015, 20));  // on the bare root window
+  Settle(100);
+  EXPECT_EQ(changes, 0);
+  ClickAt(ScreenCentre(snap));
+  ASSERT_TRUE(WaitFor([&] { return changes > 0; }));
+  EXPECT_FALSE(snap->IsChecked());
+  EXPECT_EQ(sender, snap);
+}
+
+TEST_F(GalleryOnX11, TheServerShowsThePixelsOfTheHeadlessRenderingOfThePage) {
+  PixelImage onServer;
+  const PixelImage headless = RenderHeadless();
+  ASSERT_EQ(headless.width, kWidth);
+  // The server has the frame once no paint is pending; read until two reads agree.
+  PixelImage previous;
+  ASSERT_TRUE(WaitFor([&] {
+    previous = std::move(onServer);
+    onServer = ReadWindowFromServer();
+    return onServer.width == kWidth && previous.pixels == onServer.pixels;
+  }));
+  EXPECT_TRUE(drawbot::testing::MatchesImage(onServer, headless, "gallery-x11/window", 3));
+}
+
+TEST_F(GalleryOnX11, ThePageFollowsTheWindowWhenTheServerResizesIt) {
+  const ui::OS_WindowHandle handle = mWindow->GetHandle();
+  const std::uint32_t size[] = {700, 480};
+  xcb_configure_window(mUser, static_cast<xcb_window_t>(handle), XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT,
+                       size);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return mPage->UI_GetLocalRectF(false).width == 700.0f; }));
+  EXPECT_EQ(mPage->UI_GetLocalRectF(false).height, 480.0f);
+  const ui::UI_Node::RectF controls = mPage->GetSection("section-controls")->UI_GetLocalRectF(true);
+  EXPECT_LE(controls.left + controls.width, 700.0f) << "the sections were laid out again";
+}
+
+// The program as a user starts it on the display: it maps its window, paints
+// it, and with --exit-after-first-frame exits at once, telling the time.
+TEST(GalleryProgramOnX11, TheProgramShowsItsFirstFrameOnTheDisplayAndExits) {
+  XvfbServer* server = XvfbServer::Get();
+  if (!server) GTEST_SKIP() << "Xvfb is not available";
+  const std::string command = "DISPLAY=" + server->GetDisplayName() + " timeout 20 '" +
+                              std::string(NORVIK_GALLERY_EXE) + "' --exit-after-first-frame 2>&1";
+  FILE* pipe = popen(command.c_str(), "r");
+  ASSERT_NE(pipe, nullptr);
+  std::string output;
+  char buffer[256];
+  while (std::fgets(buffer, sizeof buffer, pipe)) output += buffer;
+  const int status = pclose(pipe);
+  ASSERT_TRUE(WIFEXITED(status)) << output;
+  EXPECT_EQ(WEXITSTATUS(status), 0) << output;
+  EXPECT_NE(output.find("First frame after "), std::string::npos) << output;
+  EXPECT_EQ(output.find("rendering to"), std::string::npos) << "the window went to the display: " << output;
+}
+
+}  // namespace
+}  // namespace norvik::test
