@@ -7,6 +7,7 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 #include <string>
 
 #include "ControlsView.h"
@@ -190,6 +191,39 @@ TEST_F(GalleryOnX11, ThePageFollowsTheWindowWhenTheServerResizesIt) {
   EXPECT_EQ(mPage->UI_GetLocalRectF(false).height, 480.0f);
   const ui::UI_Node::RectF controls = mPage->GetSection("section-controls")->UI_GetLocalRectF(true);
   EXPECT_LE(controls.left + controls.width, 700.0f) << "the sections were laid out again";
+}
+
+TEST_F(GalleryOnX11, TheWindowManagersCloseRequestEndsTheLoopAndTheWindowIsGone) {
+  const ui::OS_WindowHandle handle = mWindow->GetHandle();
+  auto atom = [&](const char* inName) {
+    xcb_intern_atom_reply_t* reply = xcb_intern_atom_reply(
+        mUser, xcb_intern_atom(mUser, 0, static_cast<std::uint16_t>(std::strlen(inName)), inName), nullptr);
+    const xcb_atom_t value = reply ? reply->atom : static_cast<xcb_atom_t>(XCB_ATOM_NONE);
+    std::free(reply);
+    return value;
+  };
+  // What a window manager sends when the user clicks the close box.
+  xcb_client_message_event_t message{};
+  message.response_type = XCB_CLIENT_MESSAGE;
+  message.format = 32;
+  message.window = static_cast<xcb_window_t>(handle);
+  message.type = atom("WM_PROTOCOLS");
+  message.data.data32[0] = atom("WM_DELETE_WINDOW");
+  message.data.data32[1] = XCB_CURRENT_TIME;
+  xcb_send_event(mUser, 0, static_cast<xcb_window_t>(handle), XCB_EVENT_MASK_NO_EVENT,
+                 reinterpret_cast<const char*>(&message));
+  xcb_flush(mUser);
+  EXPECT_EQ(mWindow->Run(), 0);
+  EXPECT_FALSE(mWindow->IsOpen());
+  EXPECT_FALSE(mLayer->IsWindow(handle));
+  // Requests of two connections reach the server in no fixed order: ask for a while.
+  EXPECT_TRUE(WaitFor([&] {
+    xcb_get_window_attributes_reply_t* attributes = xcb_get_window_attributes_reply(
+        mUser, xcb_get_window_attributes(mUser, static_cast<xcb_window_t>(handle)), nullptr);
+    const bool known = attributes != nullptr;
+    std::free(attributes);
+    return !known;
+  }, 1000)) << "the server still knows the window";
 }
 
 // The program as a user starts it on the display: it maps its window, paints
