@@ -9,6 +9,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <string>
+#include <vector>
 
 #include "ControlsView.h"
 #include "GalleryPage.h"
@@ -165,6 +166,24 @@ TEST_F(GalleryOnX11, AClickOnTheCheckboxTogglesItAndAClickBesideTheWindowDoesNot
   ASSERT_TRUE(WaitFor([&] { return changes > 0; }));
   EXPECT_FALSE(snap->IsChecked());
   EXPECT_EQ(sender, snap);
+}
+
+TEST_F(GalleryOnX11, TabTypedOnTheKeyboardWalksTheFocusTilesAndShiftTabWalksBack) {
+  constexpr std::uint32_t kKeysymTab = 0xFF09, kKeysymShift = 0xFFE1;
+  const std::vector<ui::UI_Node*> tiles = mPage->GetFocusTiles();
+  ASSERT_GE(tiles.size(), 2u);
+  ASSERT_EQ(mLayer->GetActiveWindow(), mWindow->GetHandle()) << "the shown main window is active";
+  Key(kKeysymTab, true);
+  Key(kKeysymTab, false);
+  ASSERT_TRUE(WaitFor([&] { return tiles[0]->UI_HasKeyboardFocus(true); })) << "Tab gave the first tile the focus";
+  Key(kKeysymTab, true);
+  Key(kKeysymTab, false);
+  ASSERT_TRUE(WaitFor([&] { return tiles[1]->UI_HasKeyboardFocus(true); }));
+  Key(kKeysymShift, true);
+  Key(kKeysymTab, true);
+  Key(kKeysymTab, false);
+  Key(kKeysymShift, false);
+  EXPECT_TRUE(WaitFor([&] { return tiles[0]->UI_HasKeyboardFocus(true); })) << "Shift+Tab went back";
 }
 
 TEST_F(GalleryOnX11, TheServerShowsThePixelsOfTheHeadlessRenderingOfThePage) {
