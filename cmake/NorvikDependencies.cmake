@@ -8,4 +8,7 @@ pkg_check_modules(PANGO REQUIRED IMPORTED_TARGET pangocairo pangoft2 fontconfig)
 pkg_check_modules(XCB REQUIRED IMPORTED_TARGET
   xcb xcb-randr xcb-xkb xcb-xtest xcb-shape xcb-render xcb-cursor xcb-xfixes xcb-icccm
   xkbcommon xkbcommon-x11)
+# OpenGL views draw through GLX, which speaks through an Xlib display.
+find_package(OpenGL REQUIRED COMPONENTS OpenGL GLX)
+pkg_check_modules(XLIB REQUIRED IMPORTED_TARGET x11)
 find_package(Threads REQUIRED)

@@ -12,7 +12,7 @@ PACKAGES=(
   libxcb1-dev libxcb-randr0-dev libxcb-xkb-dev libxcb-xtest0-dev libxcb-shape0-dev
   libxcb-render0-dev libxcb-cursor-dev libxcb-xfixes0-dev libxcb-icccm4-dev
   libxkbcommon-dev libxkbcommon-x11-dev
-  libgl-dev libglx-dev mesa-common-dev
+  libx11-dev libgl-dev libglx-dev mesa-common-dev libgl1-mesa-dri
   libgtest-dev libgmock-dev googletest libbenchmark-dev
   xvfb xdotool xclip x11-utils
 )

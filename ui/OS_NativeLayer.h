@@ -85,6 +85,31 @@ constexpr OS_WindowHandle kOSInsertNoTopmost = static_cast<OS_WindowHandle>(-2);
 using OS_CursorHandle = std::uintptr_t;
 using OS_TimerCallback = std::function<void()>;
 
+// OpenGL. A GL surface is what GL draws on inside a native window (a device
+// on some platforms, a drawable on others); a GL context holds the GL state
+// and draws on a surface of its pixel format. Both are the platform's
+// handles, 0 meaning none.
+using OS_GLSurfaceHandle = std::uintptr_t;
+using OS_GLContextHandle = std::uintptr_t;
+
+// What a GL surface is made with: RGBA colour of colorBits bits (alpha not
+// counted), a depth buffer of depthBits bits, and a back buffer that
+// SwapGLBuffers presents when doubleBuffered.
+struct OS_GLPixelFormat {
+  bool doubleBuffered = true;
+  int colorBits = 24;
+  int depthBits = 16;
+};
+
+// The surface and context current on the calling thread, whoever made them
+// current: the toolkit or the host. connection is the platform's own (the
+// display a context belongs to, where that matters), for putting them back.
+struct OS_GLCurrent {
+  void* connection = nullptr;
+  OS_GLSurfaceHandle surface = 0;
+  OS_GLContextHandle context = 0;
+};
+
 class OS_NativeLayer {
  public:
   virtual ~OS_NativeLayer() = default;
@@ -241,6 +266,29 @@ class OS_NativeLayer {
 
   // ---- caret (for hosted text fields) ----
   virtual void ShowCaret(OS_WindowHandle inWindow, bool inShow) = 0;
+
+  // ---- OpenGL (views that draw with GL) ----
+  // A platform without GL keeps these defaults: nothing is made, and every
+  // operation answers 0 or false.
+  //
+  // A surface covering the client area of inWindow, following its size, made
+  // with inFormat; 0 when the window or a matching format is missing.
+  virtual OS_GLSurfaceHandle CreateGLSurface(OS_WindowHandle inWindow, const OS_GLPixelFormat& inFormat);
+  virtual void DestroyGLSurface(OS_GLSurfaceHandle inSurface);
+  // A context for drawing on inSurface (and on surfaces of its format).
+  virtual OS_GLContextHandle CreateGLContext(OS_GLSurfaceHandle inSurface);
+  // Destroys a context; one that is current stops being current first.
+  virtual void DestroyGLContext(OS_GLContextHandle inContext);
+  virtual OS_GLCurrent GetCurrentGLContext() const;
+  // Makes the surface and context current; an answer of GetCurrentGLContext
+  // puts back what was current, and an empty one leaves no context current.
+  // False when the pair is unknown or refused.
+  virtual bool MakeGLContextCurrent(const OS_GLCurrent& inCurrent);
+  // Fills the colour buffer of the current context with the colour (and its
+  // depth buffer with the far plane).
+  virtual void ClearGLContext(float inRed, float inGreen, float inBlue, float inAlpha);
+  // Presents the back buffer of a double-buffered surface.
+  virtual bool SwapGLBuffers(OS_GLSurfaceHandle inSurface);
 };
 
 // The layer the toolkit uses. The host (or the application loop) installs one

@@ -10,8 +10,16 @@ void OS_OpenGLViewBase::UI_SetParent(UI_Container* inParent) {
 }
 
 void OS_OpenGLViewBase::UI_Draw(drawbot::Drawbot*) {
+  UI_NodeProtector protect(this);
   PreDrawOpenGL();
-  DrawOpenGL();
+  // A failing subclass still puts the previous context back before the
+  // error leaves the paint.
+  try {
+    DrawOpenGL();
+  } catch (...) {
+    PostDrawOpenGL();
+    throw;
+  }
   PostDrawOpenGL();
 }
 

@@ -71,6 +71,7 @@ struct X11Timer {
 };
 
 class X11KeyboardLayout;
+class X11GLContexts;
 
 // Whether a top level of these styles bypasses the window manager
 // (override-redirect).
@@ -197,6 +198,16 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   bool GetPreference(const std::string& inName, bool& outValue) const override;
   void ShowCaret(OS_WindowHandle inWindow, bool inShow) override;
 
+  // ---- OpenGL (X11OpenGL.cpp) ----
+  OS_GLSurfaceHandle CreateGLSurface(OS_WindowHandle inWindow, const OS_GLPixelFormat& inFormat) override;
+  void DestroyGLSurface(OS_GLSurfaceHandle inSurface) override;
+  OS_GLContextHandle CreateGLContext(OS_GLSurfaceHandle inSurface) override;
+  void DestroyGLContext(OS_GLContextHandle inContext) override;
+  OS_GLCurrent GetCurrentGLContext() const override;
+  bool MakeGLContextCurrent(const OS_GLCurrent& inCurrent) override;
+  void ClearGLContext(float inRed, float inGreen, float inBlue, float inAlpha) override;
+  bool SwapGLBuffers(OS_GLSurfaceHandle inSurface) override;
+
   // ---- for tests and tools ----
   xcb_connection_t* GetConnection() const { return mConnection; }
   xcb_window_t GetRootWindow() const { return mScreen->root; }
@@ -263,6 +274,10 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void Present(X11Window& ioWindow, cairo_region_t* inRegion);
   // monitors (X11Monitors.cpp)
   OS_Rect ReadWorkArea();
+  // OpenGL (X11OpenGL.cpp): the GL connection, opened on first use, and the
+  // window that a GL surface lies in (0 for other windows).
+  X11GLContexts& GL() const;
+  OS_WindowHandle GLSurfaceOwner(std::uint32_t inWindow) const;
 
   friend class X11KeyboardLayout;
 
@@ -310,6 +325,9 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   int mWakePipe[2] = {-1, -1};
   tarsel::threads::AsyncEventLoopAdaptorPtr mExecutor;
   std::unique_ptr<drawbot::SupplierInterface, void (*)(drawbot::SupplierInterface*)> mSupplier;
+  // OpenGL
+  std::string mDisplayName;  // as given, empty for $DISPLAY
+  mutable std::unique_ptr<X11GLContexts> mGL;
 };
 
 }  // namespace norvik::ui::x11

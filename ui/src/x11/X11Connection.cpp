@@ -12,6 +12,7 @@
 #include "tarsel/ErrorManager.h"
 #include "tarsel/ThrowError.h"
 #include "ui/src/x11/OS_NativeLayer_X11.h"
+#include "ui/src/x11/X11GLContexts.h"
 #include "ui/src/x11/X11Keyboard.h"
 
 namespace norvik::ui::x11 {
@@ -28,7 +29,8 @@ void DestroySupplier(drawbot::SupplierInterface* inSupplier) {
 }  // namespace
 
 OS_NativeLayer_X11::OS_NativeLayer_X11(const char* inDisplay)
-    : mStart(std::chrono::steady_clock::now()), mSupplier(nullptr, &DestroySupplier) {
+    : mStart(std::chrono::steady_clock::now()), mSupplier(nullptr, &DestroySupplier),
+      mDisplayName(inDisplay ? inDisplay : "") {
   Connect(inDisplay);
   FindVisual();
   SetUpKeyboard();

@@ -252,7 +252,11 @@ void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
       break;
     case XCB_EXPOSE: {
       auto* expose = reinterpret_cast<xcb_expose_event_t*>(inEvent);
-      if (X11Window* window = Find(expose->window)) {
+      // A GL surface lies at the origin of its window and covers it: what
+      // it uncovers is the window's to repaint.
+      X11Window* window = Find(expose->window);
+      if (!window) window = Find(GLSurfaceOwner(expose->window));
+      if (window) {
         OS_Rect rect(expose->x, expose->y, expose->width, expose->height);
         Damage(*window, &rect);
       }
