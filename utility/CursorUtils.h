@@ -5,6 +5,7 @@
 // cursor is made through whatever native layer is installed, and nothing
 // happens when none is.
 #include <utility>
+#include <vector>
 
 #include <boost/intrusive_ptr.hpp>
 
@@ -30,9 +31,37 @@ enum CursorID : int {
   kFirstToolkitCursor = 7
 };
 
+// The cursors the library carries as artwork of its own, by number: a
+// picture "NativeCursor-<n>" with its hot spot in "NativeCursorData-<n>".
+enum NativeCursorID : int {
+  kCursorTextInsert = 1,        // an I-beam, where typing goes into a field
+  kCursorOpenHand = 10,         // the view can be grabbed
+  kCursorZoomIn = 11,
+  kCursorZoomOut = 12,
+  kCursorClosedHand = 13,       // panning the view
+  kCursorResizeColumns = 14,    // a vertical divider moves left and right
+  kCursorScrub = 15,            // dragging left and right changes a number
+  kCursorWheel = 16,            // the wheel changes the value
+  kCursorResizeRows = 17,       // a horizontal divider moves up and down
+  kCursorHotText = 18,          // a pointing hand over hot text
+  kCursorColorPicker = 19,      // a ring around the sampled point
+  kCursorEyedropper = 20,
+  kCursorPencil = 21,
+  kCursorMove = 22,             // drags the object under the arrow
+  kCursorTrimStart = 23,        // the in point of a clip moves
+  kCursorTrimEnd = 24,          // the out point of a clip moves
+  kCursorRazor = 25             // cuts at the vertical line
+};
+
+// Every number that has such artwork, in ascending order.
+const std::vector<int>& GetNativeCursorNumbers();
+
 // The PNG and the XML resource names of cursor inID: "CursorID-<n>" and
 // "CursorDataID-<n>".
 void GetCursorResourceNames(int inID, UTF16String& outPNGName, UTF16String& outDataName);
+// The PNG and XML names of the library's own artwork for cursor inID:
+// "NativeCursor-<n>" and "NativeCursorData-<n>".
+void GetNativeCursorResourceNames(int inID, UTF16String& outPNGName, UTF16String& outDataName);
 
 // The system cursor number (such as the arrow, 32512) that stands for inID,
 // or 0 when inID is not one of the platform's cursors.

@@ -4,8 +4,9 @@
 //
 // Cursors are registered by number and made on first display: a picture
 // registered with MakeCursorFromPNG, else the toolkit-drawn "CursorID-<n>"
-// resource with the hot spot of its "CursorDataID-<n>" document. Numbers 0 to
-// 6 (but 1) are the platform's own cursors.
+// resource with the hot spot of its "CursorDataID-<n>" document, else the
+// library's own artwork for the number ("NativeCursor-<n>", see
+// NativeCursorID). Numbers 0 to 6 (but 1) are the platform's own cursors.
 #include <map>
 
 #include "tarsel/ModuleResources.h"
@@ -49,6 +50,9 @@ class OS_ResourceManager : public ui::ResourceManager {
   void LoadCursor(BigCursorInfo& ioInfo) const;
   // Reads the hot spot of a toolkit-drawn cursor, registers and shows it.
   void LoadAndDisplayCursor(int inID, UTF16String const& inPNGName, UTF16String const& inDataName) const;
+  // The same for the library's own numbered artwork; false when it has none
+  // for inID.
+  bool LoadAndDisplayNativeCursor(int inID) const;
 
   tarsel::resources::ModuleHandle mModule;
   // A cache of native cursors, filled by the const display operations.

@@ -97,10 +97,13 @@ TEST_F(CursorDisplay, TheTwoDrawnCursorsDifferAndAreMadeOnce) {
 }
 
 TEST_F(CursorDisplay, ANumberWithoutAPictureFallsBackToTheArrow) {
-  mResources.DisplayCursor(3);
-  mResources.DisplayCursor(12);
-  EXPECT_EQ(InForce(), mSystem.GetLayer().LoadSystemCursor(ui::kOSCursorArrow));
-  EXPECT_EQ(mResources.FindCursorInfo(12), nullptr);
+  for (int id : {7, 8, 9, 28, 1000}) {
+    SCOPED_TRACE(id);
+    mResources.DisplayCursor(3);
+    mResources.DisplayCursor(id);
+    EXPECT_EQ(InForce(), mSystem.GetLayer().LoadSystemCursor(ui::kOSCursorArrow));
+    EXPECT_EQ(mResources.FindCursorInfo(id), nullptr);
+  }
 }
 
 TEST_F(CursorDisplay, ARegisteredPictureIsMadeOnlyWhenFirstShown) {

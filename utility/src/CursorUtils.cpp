@@ -43,6 +43,19 @@ void GetCursorResourceNames(int inID, UTF16String& outPNGName, UTF16String& outD
   outDataName = ReplaceID(u"CursorDataID-@0", inID);
 }
 
+void GetNativeCursorResourceNames(int inID, UTF16String& outPNGName, UTF16String& outDataName) {
+  outPNGName = ReplaceID(u"NativeCursor-@0", inID);
+  outDataName = ReplaceID(u"NativeCursorData-@0", inID);
+}
+
+const std::vector<int>& GetNativeCursorNumbers() {
+  static const std::vector<int> kNumbers = {
+      kCursorTextInsert, kCursorOpenHand, kCursorZoomIn,   kCursorZoomOut,     kCursorClosedHand, kCursorResizeColumns,
+      kCursorScrub,      kCursorWheel,    kCursorResizeRows, kCursorHotText,   kCursorColorPicker, kCursorEyedropper,
+      kCursorPencil,     kCursorMove,     kCursorTrimStart, kCursorTrimEnd,    kCursorRazor};
+  return kNumbers;
+}
+
 int GetSystemCursorNumber(int inID) {
   switch (inID) {
     case kCursorArrow:

@@ -88,6 +88,14 @@ void OS_ResourceManager::LoadAndDisplayCursor(int inID, UTF16String const& inPNG
   if (info.loaded) utility::DisplayCursor(info.cursor);
 }
 
+bool OS_ResourceManager::LoadAndDisplayNativeCursor(int inID) const {
+  UTF16String pngName, dataName;
+  GetNativeCursorResourceNames(inID, pngName, dataName);
+  if (!HasBinary(pngName, u"png")) return false;
+  LoadAndDisplayCursor(inID, pngName, dataName);
+  return true;
+}
+
 void OS_ResourceManager::DisplayCursor(int inID) const {
   ui::OS_NativeLayer* layer = ui::GetNativeLayer();
   if (!layer) return;
@@ -107,6 +115,7 @@ void OS_ResourceManager::DisplayCursor(int inID) const {
     LoadAndDisplayCursor(inID, pngName, dataName);
     return;
   }
+  if (LoadAndDisplayNativeCursor(inID)) return;
   // No picture of the toolkit's own for this number: the platform's arrow
   // is the cursor that keeps the pointer usable.
   layer->SetCursor(layer->LoadSystemCursor(ui::kOSCursorArrow));

@@ -1,0 +1,187 @@
+// The library's numbered cursors (1 and 10 to 25) on the headless system:
+// each is drawn from artwork of its own, differs from every other cursor,
+// keeps its hot spot on what it draws, and is made once.
+#include <algorithm>
+#include <map>
+#include <set>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "drawbot/DrawbotWrappers.h"
+#include "support/drawbot/PixelCompare.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/OS_WindowConstants.h"
+#include "utility/CursorUtils.h"
+#include "utility/OS_ResourceManager.h"
+
+namespace norvik::utility {
+namespace {
+
+using drawbot::testing::PixelCanvas;
+using drawbot::testing::PixelImage;
+
+struct Shown {
+  ui::OS_CursorHandle handle = 0;
+  std::vector<std::uint32_t> pixels;
+  ui::OS_Point size{0, 0};
+  ui::OS_Point hotSpot{0, 0};
+
+  std::uint32_t At(long inX, long inY) const {
+    return pixels[static_cast<std::size_t>(inY * size.x + inX)];
+  }
+  bool Opaque(long inX, long inY) const {
+    return inX >= 0 && inY >= 0 && inX < size.x && inY < size.y && (At(inX, inY) >> 24) != 0;
+  }
+};
+
+class NativeCursors : public ::testing::Test {
+ protected:
+  void SetUp() override { mSystem.Install(); }
+
+  Shown Display(int inID) {
+    mResources.DisplayCursor(inID);
+    Shown shown;
+    shown.handle = mSystem.GetLayer().GetCursor();
+    EXPECT_TRUE(mSystem.GetCursorImage(shown.handle, shown.pixels, shown.size, shown.hotSpot))
+        << "cursor " << inID << " is not made from a picture";
+    return shown;
+  }
+
+  PixelImage Decoded(const UTF16String& inName) {
+    std::vector<char> bytes;
+    mResources.GetBinary(inName, u"png", &bytes);
+    drawbot::FileImageP probe(drawbot::NewOSSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
+                              static_cast<unsigned long>(bytes.size()));
+    PixelCanvas canvas(static_cast<int>(probe->GetWidth()), static_cast<int>(probe->GetHeight()));
+    drawbot::FileImageP image(canvas.GetSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
+                              static_cast<unsigned long>(bytes.size()));
+    canvas.GetSurface()->DrawImage(*image, tarsel::geom::PointT<float>(0, 0), 1);
+    return canvas.Snapshot();
+  }
+
+  ui::HeadlessWindowSystem mSystem;
+  OS_ResourceManager mResources;
+};
+
+TEST_F(NativeCursors, TheNumbersWithArtworkAreOneAndTenToTwentyFive) {
+  std::vector<int> expected{1};
+  for (int id = 10; id <= 25; ++id) expected.push_back(id);
+  EXPECT_EQ(GetNativeCursorNumbers(), expected);
+  UTF16String png, data;
+  GetNativeCursorResourceNames(13, png, data);
+  EXPECT_EQ(png, u"NativeCursor-13");
+  EXPECT_EQ(data, u"NativeCursorData-13");
+}
+
+TEST_F(NativeCursors, EachNumberShowsItsOwnPictureDistinctFromEveryOtherCursor) {
+  std::set<ui::OS_CursorHandle> handles;
+  std::set<std::vector<std::uint32_t>> pictures;
+  ui::OS_NativeLayer& layer = mSystem.GetLayer();
+  const std::set<ui::OS_CursorHandle> platform = {
+      layer.LoadSystemCursor(ui::kOSCursorArrow), layer.LoadSystemCursor(ui::kOSCursorWait),
+      layer.LoadSystemCursor(ui::kOSCursorCross), layer.LoadSystemCursor(ui::kOSCursorNo)};
+  for (int id : {26, 27}) pictures.insert(Display(id).pixels);
+  for (int id : GetNativeCursorNumbers()) {
+    SCOPED_TRACE(id);
+    mResources.DisplayCursor(0);
+    const Shown shown = Display(id);
+    EXPECT_EQ(platform.count(shown.handle), 0u) << "not a platform cursor";
+    EXPECT_TRUE(handles.insert(shown.handle).second) << "a cursor of its own";
+    EXPECT_TRUE(pictures.insert(shown.pixels).second) << "a picture of its own";
+    UTF16String png, data;
+    GetNativeCursorResourceNames(id, png, data);
+    const PixelImage artwork = Decoded(png);
+    EXPECT_EQ(shown.size.x, artwork.width);
+    EXPECT_EQ(shown.size.y, artwork.height);
+    EXPECT_EQ(shown.pixels, artwork.pixels);
+  }
+}
+
+TEST_F(NativeCursors, EveryHotSpotLiesInsideThePictureOnOrBesideADrawnPixel) {
+  for (int id : GetNativeCursorNumbers()) {
+    SCOPED_TRACE(id);
+    const Shown shown = Display(id);
+    ASSERT_GT(shown.size.x, 0);
+    ASSERT_GT(shown.size.y, 0);
+    EXPECT_GE(shown.hotSpot.x, 0);
+    EXPECT_GE(shown.hotSpot.y, 0);
+    EXPECT_LT(shown.hotSpot.x, shown.size.x);
+    EXPECT_LT(shown.hotSpot.y, shown.size.y);
+    bool drawnNearby = false;
+    for (long dy = -1; dy <= 1; ++dy)
+      for (long dx = -1; dx <= 1; ++dx) drawnNearby |= shown.Opaque(shown.hotSpot.x + dx, shown.hotSpot.y + dy);
+    EXPECT_TRUE(drawnNearby) << "hot spot (" << shown.hotSpot.x << ", " << shown.hotSpot.y << ") points at nothing";
+  }
+}
+
+TEST_F(NativeCursors, ToolsPointWithTheirTipsAndTheMoveArrowWithItsPoint) {
+  // The tip of the eyedropper and the pencil is their drawn pixel furthest
+  // down and to the left.
+  for (int id : {kCursorEyedropper, kCursorPencil}) {
+    SCOPED_TRACE(id);
+    const Shown shown = Display(id);
+    ASSERT_TRUE(shown.Opaque(shown.hotSpot.x, shown.hotSpot.y));
+    const long tip = shown.hotSpot.y - shown.hotSpot.x;
+    for (long y = 0; y < shown.size.y; ++y)
+      for (long x = 0; x < shown.size.x; ++x) {
+        if (shown.Opaque(x, y)) {
+          EXPECT_LE(y - x, tip + 2) << "drawn beyond the tip at " << x << ", " << y;
+        }
+      }
+  }
+  const Shown move = Display(kCursorMove);
+  EXPECT_EQ(move.hotSpot.x, 0);
+  EXPECT_EQ(move.hotSpot.y, 0);
+  EXPECT_EQ(move.At(0, 0), 0xFF000000u) << "the arrow's point is black";
+  const Shown text = Display(kCursorTextInsert);
+  EXPECT_EQ(text.At(text.hotSpot.x, text.hotSpot.y), 0xFF000000u) << "the I-beam's stem is under the hot spot";
+}
+
+TEST_F(NativeCursors, ThePicturesAreBlackWithAWhiteOutline) {
+  for (int id : GetNativeCursorNumbers()) {
+    SCOPED_TRACE(id);
+    const Shown shown = Display(id);
+    int black = 0, white = 0, coloured = 0;
+    for (std::uint32_t p : shown.pixels) {
+      const std::uint32_t a = p >> 24, r = (p >> 16) & 0xFF, g = (p >> 8) & 0xFF, b = p & 0xFF;
+      if (a == 0) continue;
+      if (r != g || g != b) ++coloured;
+      // Premultiplied: white has its channels equal to its alpha. Edges
+      // along diagonals are blended, so mostly covered pixels count.
+      if (a >= 0x80 && r <= 8) ++black;
+      if (a >= 0x80 && r + 8 >= a) ++white;
+    }
+    EXPECT_EQ(coloured, 0);
+    EXPECT_GT(black, 10);
+    EXPECT_GT(white, 10);
+    // The outline surrounds the picture: no black pixel touches the clear
+    // background, except at the edge of the image.
+    for (long y = 1; y + 1 < shown.size.y; ++y)
+      for (long x = 1; x + 1 < shown.size.x; ++x) {
+        if (shown.At(x, y) == 0xFF000000u) {
+          EXPECT_TRUE(shown.Opaque(x - 1, y) && shown.Opaque(x + 1, y) && shown.Opaque(x, y - 1) &&
+                      shown.Opaque(x, y + 1))
+              << "black pixel at " << x << ", " << y << " without an outline";
+        }
+      }
+  }
+}
+
+TEST_F(NativeCursors, ANumberedCursorIsMadeOnceAndKeptUntilDisposed) {
+  const Shown first = Display(kCursorClosedHand);
+  Display(kCursorZoomIn);
+  const Shown again = Display(kCursorClosedHand);
+  EXPECT_EQ(again.handle, first.handle);
+  ASSERT_NE(mResources.FindCursorInfo(kCursorClosedHand), nullptr);
+  EXPECT_TRUE(mResources.FindCursorInfo(kCursorClosedHand)->loaded);
+  mResources.DisposeCursor(kCursorClosedHand);
+  std::vector<std::uint32_t> pixels;
+  ui::OS_Point size, hot;
+  EXPECT_FALSE(mSystem.GetCursorImage(first.handle, pixels, size, hot));
+  const Shown remade = Display(kCursorClosedHand);
+  EXPECT_EQ(remade.pixels, first.pixels);
+}
+
+}  // namespace
+}  // namespace norvik::utility
