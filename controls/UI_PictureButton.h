@@ -30,6 +30,10 @@ class UI_PictureButton : public UI_Button {
   // Paints the bevel and, when the record has one, its image as the face.
   static void Draw(const DrawPictureButtonParameters& inParams, drawbot::Drawbot& inDrawbot);
 
+  // The toolkit's resource image of that name, decoded for inSupplier and
+  // cached, or null when the name is empty or the resources lack it.
+  static const drawbot::ImageInterface* LoadResourceImage(const UTF8String& inName,
+                                                         const drawbot::SupplierInterface* inSupplier);
   // Centres inImage in inRect at whole pixels; disabled images are faded by
   // the alpha of theme colour 306.
   static void DrawPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage,

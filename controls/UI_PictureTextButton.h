@@ -6,6 +6,22 @@
 
 namespace norvik::controls {
 
+// The picture of a picture-and-text button: the image at its scale, centred
+// in the picture's rectangle and faded when disabled.
+class DrawPTButtonPicture : public DrawButtonFace {
+ public:
+  DrawPTButtonPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage, float inScale)
+      : mParams(inParams), mImage(inImage), mScale(inScale) {}
+  void operator()(DrawParameters::StateFlags inState, const tarsel::geom::RectT<float>& inRect,
+                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme& inTheme,
+                  const ColorChangeMap* inMap) const override;
+
+ private:
+  const DrawParameters& mParams;
+  const drawbot::ImageInterface& mImage;
+  float mScale;
+};
+
 class UI_PictureTextButton : public UI_TextButton {
  public:
   // Which parts the button shows.
@@ -23,7 +39,7 @@ class UI_PictureTextButton : public UI_TextButton {
   void SetPictureVerticalOffset(float inOffset);
   void SetScale(float inScale);
   float GetScale() const { return mScale; }
-  void SetImageBaseName(const UTF8String& inName) { mImageBaseName = inName; }
+  void SetImageBaseName(const UTF8String& inName);
   const UTF8String& GetImageBaseName() const { return mImageBaseName; }
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
 
@@ -33,7 +49,8 @@ class UI_PictureTextButton : public UI_TextButton {
   std::pair<RectF, RectF> ComputeTextAndImageOffset(const RectF& inRect) const;
 
  protected:
-  // Draws the picture into inRect; the base draws nothing without an image.
+  // Draws the picture into inRect: the resource image of the base name, or
+  // nothing when there is none.
   virtual void DrawPicture(const DrawParameters& inParams, const RectF& inRect, drawbot::Drawbot& inDrawbot);
 
  private:

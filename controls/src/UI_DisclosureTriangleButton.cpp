@@ -86,6 +86,7 @@ void UI_DisclosureTriangleButton::DrawPicture(const DrawParameters& inParams, co
   // value follows only when the twirl has ended.
   const DrawTrianglePicture face(inParams, GetAnimationTime(), mTwirlDuration, GetDownState(), IsButtonCaptured(),
                                  GetScale());
+  if (!inParams.GetTheme()) return;
   face(inParams.GetControlState(), inRect, PointF(), inDrawbot, *inParams.GetTheme(), inParams.GetColorChangeMap());
 }
 

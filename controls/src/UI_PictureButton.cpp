@@ -67,17 +67,21 @@ const drawbot::ImageInterface* UI_PictureButton::GetImage() const {
 
 // A name that the resources do not hold draws no picture rather than failing
 // the whole paint.
-const drawbot::ImageInterface* UI_PictureButton::FindImage(const drawbot::SupplierInterface* inSupplier) const {
-  if (mSupply) return GetImage();
+const drawbot::ImageInterface* UI_PictureButton::LoadResourceImage(const UTF8String& inName,
+                                                                  const drawbot::SupplierInterface* inSupplier) {
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
-  if (mImageBaseName.empty() || !manager || !manager->GetDrawbotImageResourceCache() || !inSupplier) return nullptr;
+  if (inName.empty() || !manager || !manager->GetDrawbotImageResourceCache() || !inSupplier) return nullptr;
   try {
     return manager->GetDrawbotImageResourceCache()
-        ->GetImage(&manager->GetResourceManager(), inSupplier, mImageBaseName, drawbot::kImageFileTypePNG)
+        ->GetImage(&manager->GetResourceManager(), inSupplier, inName, drawbot::kImageFileTypePNG)
         .get();
   } catch (const tarsel::config::Exception&) {
     return nullptr;
   }
+}
+
+const drawbot::ImageInterface* UI_PictureButton::FindImage(const drawbot::SupplierInterface* inSupplier) const {
+  return mSupply ? GetImage() : LoadResourceImage(mImageBaseName, inSupplier);
 }
 
 void UI_PictureButton::DrawPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage,

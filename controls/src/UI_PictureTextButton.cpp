@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "controls/UI_PictureButton.h"
 #include "drawbot/Drawbot.h"
 
 namespace norvik::controls {
@@ -33,6 +34,12 @@ void UI_PictureTextButton::SetScale(float inScale) {
 void UI_PictureTextButton::SetImageAndTextAlignment(drawbot::TextAlignment inAlignment) {
   if (mBlockAlignment == inAlignment) return;
   mBlockAlignment = inAlignment;
+  UI_Invalidate(nullptr, 0);
+}
+
+void UI_PictureTextButton::SetImageBaseName(const UTF8String& inName) {
+  if (mImageBaseName == inName) return;
+  mImageBaseName = inName;
   UI_Invalidate(nullptr, 0);
 }
 
@@ -69,7 +76,20 @@ std::pair<ui::UI_Node::RectF, ui::UI_Node::RectF> UI_PictureTextButton::ComputeT
           RectF(textLeft, inRect.top, std::max(0.0f, inRect.left + inRect.width - textLeft), inRect.height)};
 }
 
-void UI_PictureTextButton::DrawPicture(const DrawParameters&, const RectF&, drawbot::Drawbot&) {}
+void DrawPTButtonPicture::operator()(DrawParameters::StateFlags, const tarsel::geom::RectT<float>& inRect,
+                                     const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot,
+                                     const ui::Theme&, const ColorChangeMap*) const {
+  const tarsel::geom::RectT<float> r(inRect.left + inOffset.x, inRect.top + inOffset.y, inRect.width, inRect.height);
+  UI_PictureButton::DrawPicture(mParams, mImage, r, mScale, 1, inDrawbot);
+}
+
+void UI_PictureTextButton::DrawPicture(const DrawParameters& inParams, const RectF& inRect,
+                                       drawbot::Drawbot& inDrawbot) {
+  const drawbot::ImageInterface* image = UI_PictureButton::LoadResourceImage(mImageBaseName, inDrawbot.GetSupplier());
+  if (!image || !inParams.GetTheme()) return;
+  const DrawPTButtonPicture face(inParams, *image, mScale);
+  face(inParams.GetControlState(), inRect, PointF(), inDrawbot, *inParams.GetTheme(), inParams.GetColorChangeMap());
+}
 
 void UI_PictureTextButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
   DrawPictureTextButtonParameters params(this);

@@ -4,6 +4,11 @@
 // picture buttons.
 #include <algorithm>
 #include <cmath>
+#include <cstdio>
+#include <fstream>
+#include <iterator>
+#include <memory>
+#include <sstream>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -18,6 +23,8 @@
 #include "drawbot/SupplierInterface.h"
 #include "support/controls/ControlTestSupport.h"
 #include "support/drawbot/PixelCompare.h"
+#include "support/utility/MemoryResourceManager.h"
+#include "ui/DrawbotImageResourceCache.h"
 
 namespace norvik::controls::test {
 namespace {
@@ -242,6 +249,42 @@ TEST_F(PictureTextLayout, TheStyleHidesOneOfTheParts) {
   std::tie(picture, text) = button->ComputeTextAndImageOffset(RectF(0, 0, 150, 24));
   EXPECT_EQ(picture, RectF(69, 6, 12, 12)) << "the picture alone is centred";
   EXPECT_EQ(text.width, 0);
+}
+
+// The bytes of a PNG of one opaque colour.
+std::string SolidPNG(int inSize, std::uint32_t inARGB) {
+  PixelImage image;
+  image.width = image.height = inSize;
+  image.pixels.assign(static_cast<std::size_t>(inSize * inSize), inARGB);
+  const std::string path = ::testing::TempDir() + "controls_solid.png";
+  EXPECT_TRUE(drawbot::testing::SavePNG(image, path));
+  std::ifstream in(path, std::ios::binary);
+  std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
+  std::remove(path.c_str());
+  return bytes;
+}
+
+TEST_F(PictureTextLayout, ThePictureIsTheResourceImageOfTheBaseName) {
+  auto resources = std::make_unique<utility::testing::MemoryResourceManager>();
+  resources->Put("Star", "png", SolidPNG(6, 0xFF00FF00u));
+  manager.SetResourceManager(std::move(resources));
+  manager.SetDrawbotImageResourceCache(std::make_unique<ui::DrawbotImageResourceCache>());
+  auto paint = [this] {
+    PixelCanvas canvas(150, 24);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    button->UI_Draw(&drawbot);
+    return canvas.Snapshot();
+  };
+  EXPECT_NE(paint().At(8, 12), 0xFF00FF00u) << "no base name, no picture";
+  button->SetImageBaseName("Star");
+  const PixelImage shot = paint();
+  // The picture's rectangle is 2..14 across and 6..18 down; the 6-pixel image is centred in it.
+  EXPECT_EQ(shot.At(5, 9), 0xFF00FF00u);
+  EXPECT_EQ(shot.At(10, 14), 0xFF00FF00u);
+  EXPECT_NE(shot.At(4, 9), 0xFF00FF00u);
+  EXPECT_NE(shot.At(11, 14), 0xFF00FF00u);
+  button->SetImageBaseName("Missing");
+  EXPECT_NE(paint().At(8, 12), 0xFF00FF00u) << "a name the resources lack draws no picture";
 }
 
 }  // namespace
