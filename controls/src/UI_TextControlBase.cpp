@@ -75,10 +75,15 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
   }
 }
 
+// Labels are measured before any window paints them (a layout asks for
+// recommended sizes first), so without a supplier installed in the manager
+// the platform back end's own one measures them.
 float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF16String& inLabel) {
+  if (inLabel.empty()) return 0;
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
   const drawbot::SupplierInterface* supplier = manager ? manager->GetOSDrawSupplier() : nullptr;
-  if (!supplier || inLabel.empty()) return 0;
+  if (!supplier) supplier = drawbot::NewOSSupplier();
+  if (!supplier) return 0;
   drawbot::FontP font = LabelFont(supplier, inText);
   return font ? font->MeasureStringWidth(Chars(inLabel), static_cast<long>(inLabel.size())) : 0;
 }

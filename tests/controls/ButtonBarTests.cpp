@@ -8,7 +8,6 @@
 #include "controls/UI_ButtonBar.h"
 #include "controls/UI_PictureButton.h"
 #include "drawbot/Drawbot.h"
-#include "drawbot/SupplierInterface.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/controls/ControlTestSupport.h"
 
@@ -26,10 +25,6 @@ constexpr short kDown = 40;
 class ButtonBarTest : public ControlTest {
  protected:
   ButtonBarTest() {
-    // Labels are measured with the platform's drawing supplier, a process-wide
-    // object that the manager must not delete.
-    manager.SetOSDrawSupplier(
-        std::shared_ptr<drawbot::SupplierInterface>(drawbot::NewOSSupplier(), [](drawbot::SupplierInterface*) {}));
     bar = Add(new UI_ButtonBar, RectF(5, 20, 195, 40));
     bar->AddTextButton(u"Low", 0.25);
     bar->AddTextButton(u"Medium", 0.5);

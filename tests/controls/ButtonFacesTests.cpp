@@ -20,7 +20,6 @@
 #include "controls/UI_TextButton.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
-#include "drawbot/SupplierInterface.h"
 #include "support/controls/ControlTestSupport.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/utility/MemoryResourceManager.h"
@@ -209,8 +208,6 @@ TEST(DisclosureTriangleFace, TheTriangleKeepsItsScaledSizeInALargerRectangle) {
 class PictureTextLayout : public ControlTest {
  protected:
   PictureTextLayout() {
-    manager.SetOSDrawSupplier(
-        std::shared_ptr<drawbot::SupplierInterface>(drawbot::NewOSSupplier(), [](drawbot::SupplierInterface*) {}));
     button = Add(new UI_PictureTextButton(u"Tracks"), RectF(0, 0, 150, 24));
     labelWidth = button->UI_GetRecommendedSize().x - 20;
   }

@@ -117,6 +117,16 @@ TEST_F(ToggleButtonTest, TheRecommendedTextButtonSizeAddsMarginsAndRoundsHalfAwa
   EXPECT_EQ(UI_TextButton::RecommendedSize(0, 11).x, 0);
 }
 
+TEST_F(ToggleButtonTest, ATextButtonIsMeasuredWithoutASupplierInTheManager) {
+  ASSERT_EQ(manager.GetOSDrawSupplier(), nullptr);
+  UI_TextButtonP shortLabel(new UI_TextButton(u"OK"));
+  UI_TextButtonP longLabel(new UI_TextButton(u"Render the whole sequence"));
+  UI_TextButtonP empty(new UI_TextButton);
+  EXPECT_GT(shortLabel->UI_GetRecommendedSize().x, 20) << "the label's width and the two margins";
+  EXPECT_GT(longLabel->UI_GetRecommendedSize().x, shortLabel->UI_GetRecommendedSize().x + 50);
+  EXPECT_EQ(empty->UI_GetRecommendedSize().x, 0);
+}
+
 TEST_F(ToggleButtonTest, ATextButtonShowsItsLabelWithoutTheMnemonicMarker) {
   manager.EnableMnemonics();
   UI_TextButtonP button(new UI_TextButton(u"&Render"));
