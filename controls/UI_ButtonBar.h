@@ -78,6 +78,7 @@ class UI_ButtonBar : public UI_InteractiveControlView {
   // The enabled, visible button next to the selection in direction inStep,
   // or -1 when the row ends first.
   int NeighbourOfSelection(int inStep) const;
+  void DrawBarFrame(drawbot::Drawbot& inDrawbot) const;
 
   std::vector<Entry> mButtons;
   int mSelected = -1;

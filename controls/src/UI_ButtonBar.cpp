@@ -211,7 +211,13 @@ void UI_ButtonBar::DrawFrame(const DrawButtonParameters& inParams, drawbot::Draw
 }
 
 void UI_ButtonBar::UI_Draw(drawbot::Drawbot* inDrawbot) {
-  if (!inDrawbot || mButtons.empty()) return;
+  if (!inDrawbot) return;
+  if (!mButtons.empty()) DrawBarFrame(*inDrawbot);
+  // The buttons paint themselves over the frame.
+  UI_InteractiveControlView::UI_Draw(inDrawbot);
+}
+
+void UI_ButtonBar::DrawBarFrame(drawbot::Drawbot& inDrawbot) const {
   DrawButtonParameters params(this);
   // The bar is not repainted as the cursor crosses it, so its frame never
   // shows the rollover look; the buttons light up on their own.
@@ -220,7 +226,7 @@ void UI_ButtonBar::UI_Draw(drawbot::Drawbot* inDrawbot) {
   params.SetControlState(state);
   const RectF local = UI_GetLocalRectF(false);
   params.SetRectF(RectF(0, 0, std::min(GetButtonbarWidth(), local.width), std::min(GetButtonbarHeight(), local.height)));
-  DrawFrame(params, *inDrawbot);
+  DrawFrame(params, inDrawbot);
 }
 
 }  // namespace norvik::controls

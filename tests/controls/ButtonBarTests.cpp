@@ -93,11 +93,25 @@ TEST_F(ButtonBarTest, ButtonNamesCarryTheBarsNameAndTheirIndex) {
   EXPECT_EQ(bar->GetButton(-1), nullptr);
 }
 
-TEST_F(ButtonBarTest, TheFramePaintsTheRowOfButtonsAndNothingBeyond) {
-  drawbot::testing::PixelCanvas canvas(200, 40);
+// Paints the bar as the draw traversal does: the bar, then its buttons.
+drawbot::testing::PixelImage PaintBar(UI_ButtonBar& inBar, int inWidth, int inHeight) {
+  drawbot::testing::PixelCanvas canvas(inWidth, inHeight);
   drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
-  bar->UI_Draw(&drawbot);
-  const auto image = canvas.Snapshot();
+  inBar.UI_Draw(&drawbot);
+  return canvas.Snapshot();
+}
+
+// Whether the pixels of two images agree inside the columns [inLeft, inRight).
+bool SameColumns(const drawbot::testing::PixelImage& inA, const drawbot::testing::PixelImage& inB, int inLeft,
+                 int inRight) {
+  for (int y = 0; y < inA.height; ++y)
+    for (int x = inLeft; x < inRight; ++x)
+      if (inA.At(x, y) != inB.At(x, y)) return false;
+  return true;
+}
+
+TEST_F(ButtonBarTest, TheFramePaintsTheRowOfButtonsAndNothingBeyond) {
+  const auto image = PaintBar(*bar, 200, 40);
   const int width = static_cast<int>(bar->GetButtonbarWidth());
   const int height = static_cast<int>(bar->GetButtonbarHeight());
   ASSERT_LT(width, 200);
@@ -109,12 +123,21 @@ TEST_F(ButtonBarTest, TheFramePaintsTheRowOfButtonsAndNothingBeyond) {
   EXPECT_EQ(drawbot::testing::ColumnCoverage(image, width / 2),
             "." + std::string(height - 2, '#') + std::string(40 - height + 1, '.'));
 
-  drawbot::testing::PixelCanvas empty(50, 20);
-  drawbot::Drawbot emptyBot(empty.GetSupplier(), empty.GetSurface());
   UI_ButtonBarP none(new UI_ButtonBar);
   none->UI_SetLocalRectF(RectF(0, 0, 50, 20));
-  none->UI_Draw(&emptyBot);
-  EXPECT_EQ(drawbot::testing::RowCoverage(empty.Snapshot(), 10), std::string(50, '.')) << "no buttons, no frame";
+  EXPECT_EQ(drawbot::testing::RowCoverage(PaintBar(*none, 50, 20), 10), std::string(50, '.'))
+      << "no buttons, no frame";
+}
+
+TEST_F(ButtonBarTest, TheButtonsPaintOverTheFrameAndTheSelectedOneLooksDown) {
+  const auto unselected = PaintBar(*bar, 200, 40);
+  bar->SetValue(0.5);
+  const auto selected = PaintBar(*bar, 200, 40);
+  const RectF middle = bar->GetButton(1)->UI_GetLocalRectF(true);
+  const int left = static_cast<int>(middle.left), right = static_cast<int>(middle.left + middle.width);
+  EXPECT_FALSE(SameColumns(unselected, selected, left, right)) << "the middle segment changed its look";
+  EXPECT_TRUE(SameColumns(unselected, selected, 0, left)) << "the first segment did not";
+  EXPECT_TRUE(SameColumns(unselected, selected, right, 200)) << "nor did the last";
 }
 
 // ---- the selection rule ----
