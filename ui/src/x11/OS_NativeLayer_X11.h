@@ -224,7 +224,16 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   // connection and atoms (X11Connection.cpp)
   void Connect(const char* inDisplay);
   void FindVisual();
+  // others' doings to our windows (X11WindowState.cpp)
+  std::uint32_t ReadWmState(xcb_window_t inWindow);
+  void TranslateUnmap(const xcb_unmap_notify_event_t* inEvent);
+  void TranslateMap(const xcb_map_notify_event_t* inEvent);
+  void NoticeGrabEnd(const xcb_enter_notify_event_t* inEvent);
+  // XSETTINGS (X11Settings.cpp)
+  void WatchXSettings();
   void ReadXSettings();
+  // Answers true when inEvent concerned the settings daemon and was handled.
+  bool TranslateSettingsEvent(const xcb_generic_event_t* inEvent);
   // window manager hints (X11Hints.cpp)
   void ApplyTopLevelHints(X11Window& ioWindow);
   void ApplyIcccmHints(X11Window& ioWindow);
@@ -293,6 +302,7 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   OS_WindowHandle mActive = 0;
   OS_WindowHandle mFocus = 0;
   OS_WindowHandle mCapture = 0;
+  unsigned mGrabSequence = 0;  // of the pointer grab that stands for mCapture
   OS_WindowHandle mPointerWindow = 0;
   OS_Point mPointer;
   bool mPointerInside = false;  // over one of our windows: mPointer is current
@@ -300,6 +310,7 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   std::map<int, OS_CursorHandle> mSystemCursors;
   void* mCursorContext = nullptr;
   unsigned mDoubleClickTime = 500;
+  xcb_window_t mXSettingsWindow = 0;  // the settings daemon's window, 0 when none runs
   OS_EventTime mMessageTime = 0;
   std::chrono::steady_clock::time_point mStart;
   // double clicks

@@ -1,5 +1,5 @@
 // The connection to the X server: opening it, atoms, the visual used for
-// painting, XSETTINGS, and the reporting of X errors.
+// painting, and the reporting of X errors.
 #include <fcntl.h>
 #include <unistd.h>
 
@@ -34,7 +34,7 @@ OS_NativeLayer_X11::OS_NativeLayer_X11(const char* inDisplay)
   Connect(inDisplay);
   FindVisual();
   SetUpKeyboard();
-  ReadXSettings();
+  WatchXSettings();
   xcb_cursor_context_t* context = nullptr;
   if (xcb_cursor_context_new(mConnection, mScreen, &context) == 0) mCursorContext = context;
   if (pipe2(mWakePipe, O_CLOEXEC | O_NONBLOCK) != 0) mWakePipe[0] = mWakePipe[1] = -1;
@@ -120,57 +120,6 @@ void OS_NativeLayer_X11::ReportXError(const xcb_generic_error_t* inError, const 
   report.mGroup = tarsel::config::kErrorGroupResources;
   report.mCode = static_cast<int>(inError->error_code);
   tarsel::config::ErrorManager::Get(true)->ReportError(report);
-}
-
-// XSETTINGS: the settings manager of the desktop, when one runs, owns the
-// selection _XSETTINGS_S<screen> and keeps its settings in a property of the
-// owner window. Only the double-click time is read.
-void OS_NativeLayer_X11::ReadXSettings() {
-  xcb_get_selection_owner_reply_t* owner = xcb_get_selection_owner_reply(
-      mConnection, xcb_get_selection_owner(mConnection, Atom("_XSETTINGS_S0")), nullptr);
-  xcb_window_t window = owner ? owner->owner : xcb_window_t(XCB_WINDOW_NONE);
-  std::free(owner);
-  if (window == XCB_WINDOW_NONE) return;
-  xcb_atom_t settings = Atom("_XSETTINGS_SETTINGS");
-  xcb_get_property_reply_t* reply = xcb_get_property_reply(
-      mConnection, xcb_get_property(mConnection, 0, window, settings, settings, 0, 16384), nullptr);
-  if (!reply) return;
-  const auto* data = static_cast<const std::uint8_t*>(xcb_get_property_value(reply));
-  std::size_t size = static_cast<std::size_t>(xcb_get_property_value_length(reply));
-  if (size >= 12 && data[0] == 0) {  // little-endian data only
-    auto read32 = [&](std::size_t at) {
-      return static_cast<std::uint32_t>(data[at] | (data[at + 1] << 8) | (data[at + 2] << 16) |
-                                        (static_cast<std::uint32_t>(data[at + 3]) << 24));
-    };
-    std::uint32_t count = read32(8);
-    std::size_t at = 12;
-    for (std::uint32_t i = 0; i < count && at + 4 <= size; ++i) {
-      std::uint8_t type = data[at];
-      std::size_t nameLength = static_cast<std::size_t>(data[at + 2] | (data[at + 3] << 8));
-      std::size_t nameAt = at + 4;
-      std::size_t padded = (nameLength + 3) & ~std::size_t(3);
-      std::size_t valueAt = nameAt + padded + 4;  // the serial follows the name
-      if (valueAt > size) break;
-      std::string name(reinterpret_cast<const char*>(data + nameAt), nameLength);
-      if (type == 0) {  // integer
-        if (valueAt + 4 > size) break;
-        if (name == "Net/DoubleClickTime") {
-          std::uint32_t value = read32(valueAt);
-          if (value > 0 && value < 5000) mDoubleClickTime = value;
-        }
-        at = valueAt + 4;
-      } else if (type == 1) {  // string
-        if (valueAt + 4 > size) break;
-        std::size_t length = read32(valueAt);
-        at = valueAt + 4 + ((length + 3) & ~std::size_t(3));
-      } else if (type == 2) {  // colour
-        at = valueAt + 8;
-      } else {
-        break;
-      }
-    }
-  }
-  std::free(reply);
 }
 
 }  // namespace norvik::ui::x11

@@ -165,6 +165,7 @@ void OS_NativeLayer_X11::TranslateMotion(const xcb_motion_notify_event_t* inEven
 void OS_NativeLayer_X11::TranslateCrossing(const xcb_enter_notify_event_t* inEvent, bool inEnter) {
   const OS_Point screen(inEvent->root_x, inEvent->root_y);
   mPointer = screen;
+  NoticeGrabEnd(inEvent);
   const X11Window* window = Find(inEvent->event);
   if (inEnter)
     mPointerInside = true;
@@ -227,6 +228,8 @@ void OS_NativeLayer_X11::TranslateClientMessage(const xcb_client_message_event_t
 
 void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
   const std::uint8_t type = inEvent->response_type & 0x7F;
+  if (mXSettingsWindow != 0 || type == XCB_CLIENT_MESSAGE)
+    if (TranslateSettingsEvent(inEvent)) return;
   switch (type) {
     case 0:
       ReportXError(reinterpret_cast<xcb_generic_error_t*>(inEvent), "request");
@@ -271,6 +274,12 @@ void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
       if (X11Window* window = Find(destroyed->window); window && !window->destroying) ForgetDestroyedWindow(destroyed->window);
       break;
     }
+    case XCB_UNMAP_NOTIFY:
+      TranslateUnmap(reinterpret_cast<xcb_unmap_notify_event_t*>(inEvent));
+      break;
+    case XCB_MAP_NOTIFY:
+      TranslateMap(reinterpret_cast<xcb_map_notify_event_t*>(inEvent));
+      break;
     case XCB_REPARENT_NOTIFY: {
       auto* reparent = reinterpret_cast<xcb_reparent_notify_event_t*>(inEvent);
       if (X11Window* window = Find(reparent->window); window && window->parent == 0)

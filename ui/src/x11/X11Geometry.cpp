@@ -289,6 +289,7 @@ void OS_NativeLayer_X11::SetCapture(OS_WindowHandle inWindow) {
       XCB_EVENT_MASK_POINTER_MOTION | XCB_EVENT_MASK_BUTTON_PRESS | XCB_EVENT_MASK_BUTTON_RELEASE |
           XCB_EVENT_MASK_ENTER_WINDOW | XCB_EVENT_MASK_LEAVE_WINDOW,
       XCB_GRAB_MODE_ASYNC, XCB_GRAB_MODE_ASYNC, XCB_NONE, XCB_NONE, XCB_CURRENT_TIME);
+  mGrabSequence = cookie.sequence;
   std::free(xcb_grab_pointer_reply(mConnection, cookie, nullptr));
   if (old != 0 && Find(old)) CallProcedure(old, kOSMsgCaptureChanged, 0, static_cast<std::intptr_t>(inWindow));
 }

@@ -1,0 +1,371 @@
+// The X11 layer among other clients: the hints a window manager reads, the
+// close request, iconifying and restoring by a window manager, a pointer grab
+// lost with its window, activation asked of and given by the window manager,
+// XSETTINGS, opacity, the work area, and X errors.
+#include <unistd.h>
+#include <xcb/xcb.h>
+#include <xcb/xcb_icccm.h>
+
+#include <cstdlib>
+#include <cstring>
+#include <string>
+#include <vector>
+
+#include "tarsel/ErrorManager.h"
+#include "tarsel/UTFString.h"
+#include "x11/X11Fixture.h"
+
+namespace norvik::test {
+namespace {
+
+using namespace norvik::ui;
+
+class X11Protocol : public X11Fixture {
+ protected:
+  xcb_atom_t UserAtom(const char* inName) {
+    xcb_intern_atom_reply_t* reply = xcb_intern_atom_reply(
+        mUser, xcb_intern_atom(mUser, 0, static_cast<uint16_t>(std::strlen(inName)), inName), nullptr);
+    const xcb_atom_t atom = reply ? reply->atom : xcb_atom_t(XCB_ATOM_NONE);
+    std::free(reply);
+    return atom;
+  }
+  // A property's 32-bit items; empty when the window has none.
+  std::vector<std::uint32_t> Read32(xcb_window_t inWindow, const char* inProperty) {
+    xcb_get_property_reply_t* reply = xcb_get_property_reply(
+        mUser, xcb_get_property(mUser, 0, inWindow, UserAtom(inProperty), XCB_GET_PROPERTY_TYPE_ANY, 0, 64), nullptr);
+    std::vector<std::uint32_t> values;
+    if (reply && reply->format == 32) {
+      const auto* data = static_cast<const std::uint32_t*>(xcb_get_property_value(reply));
+      values.assign(data, data + xcb_get_property_value_length(reply) / 4);
+    }
+    std::free(reply);
+    return values;
+  }
+  std::string ReadString(xcb_window_t inWindow, xcb_atom_t inProperty) {
+    xcb_get_property_reply_t* reply = xcb_get_property_reply(
+        mUser, xcb_get_property(mUser, 0, inWindow, inProperty, XCB_GET_PROPERTY_TYPE_ANY, 0, 256), nullptr);
+    std::string text;
+    if (reply) text.assign(static_cast<const char*>(xcb_get_property_value(reply)), xcb_get_property_value_length(reply));
+    std::free(reply);
+    return text;
+  }
+  bool HasAtom(const std::vector<std::uint32_t>& inAtoms, const char* inName) {
+    const xcb_atom_t atom = UserAtom(inName);
+    for (std::uint32_t a : inAtoms)
+      if (a == atom) return true;
+    return false;
+  }
+  bool IsOverrideRedirect(xcb_window_t inWindow) {
+    xcb_get_window_attributes_reply_t* a =
+        xcb_get_window_attributes_reply(mUser, xcb_get_window_attributes(mUser, inWindow), nullptr);
+    const bool result = a && a->override_redirect;
+    std::free(a);
+    return result;
+  }
+  void SendProtocol(OS_WindowHandle inWindow, const char* inProtocol) {
+    xcb_client_message_event_t message{};
+    message.response_type = XCB_CLIENT_MESSAGE;
+    message.format = 32;
+    message.window = static_cast<xcb_window_t>(inWindow);
+    message.type = UserAtom("WM_PROTOCOLS");
+    message.data.data32[0] = UserAtom(inProtocol);
+    xcb_send_event(mUser, 0, message.window, XCB_EVENT_MASK_NO_EVENT, reinterpret_cast<const char*>(&message));
+    xcb_flush(mUser);
+  }
+  // The user's round trip: the server has done what the user asked.
+  void UserSync() { std::free(xcb_get_input_focus_reply(mUser, xcb_get_input_focus(mUser), nullptr)); }
+};
+
+// ---- hints ----
+
+TEST_F(X11Protocol, AMainWindowNamesItsClassTakesFocusAndKeepsItsPlace) {
+  const OS_WindowHandle main = MakeShownWindow(OS_Rect(40, 50, 200, 100), 0x101010);
+  const std::string kClass = "TolliverLord - Window Class";
+  EXPECT_EQ(ReadString(main, XCB_ATOM_WM_CLASS), kClass + '\0' + kClass + '\0');
+  EXPECT_TRUE(HasAtom(Read32(main, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_NORMAL"));
+  EXPECT_TRUE(HasAtom(Read32(main, "WM_PROTOCOLS"), "WM_DELETE_WINDOW"));
+  EXPECT_EQ(Read32(main, "_NET_WM_PID"), std::vector<std::uint32_t>{static_cast<std::uint32_t>(getpid())});
+  EXPECT_FALSE(IsOverrideRedirect(main));
+
+  xcb_icccm_wm_hints_t hints{};
+  ASSERT_TRUE(xcb_icccm_get_wm_hints_reply(mUser, xcb_icccm_get_wm_hints(mUser, main), &hints, nullptr));
+  EXPECT_TRUE(hints.flags & XCB_ICCCM_WM_HINT_INPUT);
+  EXPECT_TRUE(hints.input);
+  xcb_size_hints_t size{};
+  ASSERT_TRUE(xcb_icccm_get_wm_normal_hints_reply(mUser, xcb_icccm_get_wm_normal_hints(mUser, main), &size, nullptr));
+  EXPECT_TRUE(size.flags & XCB_ICCCM_SIZE_HINT_P_POSITION);
+  EXPECT_EQ(size.x, 40);
+  EXPECT_EQ(size.y, 50);
+  EXPECT_FALSE(size.flags & XCB_ICCCM_SIZE_HINT_P_MAX_SIZE) << "a window with a sizing frame may be resized";
+
+  // The node property marks the window as the toolkit's for other clients too.
+  int node = 0;
+  mLayer->SetProperty(main, "norvik::ui::OS_Window::property", &node);
+  mLayer->ProcessPendingEvents();  // sends what is buffered
+  EXPECT_FALSE(Read32(main, "norvik::ui::OS_Window::property").empty());
+  mLayer->RemoveProperty(main, "norvik::ui::OS_Window::property");
+  mLayer->ProcessPendingEvents();
+  EXPECT_TRUE(Read32(main, "norvik::ui::OS_Window::property").empty());
+}
+
+TEST_F(X11Protocol, OwnedAndModalWindowsAreTransientDialogs) {
+  const OS_WindowHandle main = MakeShownWindow(OS_Rect(0, 0, 300, 200), 0x101010);
+  const OS_WindowHandle owned = MakeShownWindow(OS_Rect(20, 20, 100, 80), 0x202020, kOSStyleOverlappedWindow, 0, main);
+  const OS_WindowHandle modal =
+      MakeShownWindow(OS_Rect(40, 40, 100, 80), 0x303030, kOSStyleCaption | kOSStyleSysMenu,
+                      kOSExStyleDialogModalFrame, main);
+  EXPECT_EQ(Read32(owned, "WM_TRANSIENT_FOR"), std::vector<std::uint32_t>{static_cast<std::uint32_t>(main)});
+  EXPECT_TRUE(HasAtom(Read32(owned, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_DIALOG"));
+  EXPECT_TRUE(HasAtom(Read32(owned, "_NET_WM_STATE"), "_NET_WM_STATE_SKIP_TASKBAR"));
+  EXPECT_FALSE(HasAtom(Read32(owned, "_NET_WM_STATE"), "_NET_WM_STATE_MODAL"));
+  EXPECT_TRUE(HasAtom(Read32(modal, "_NET_WM_STATE"), "_NET_WM_STATE_MODAL"));
+  EXPECT_TRUE(HasAtom(Read32(modal, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_DIALOG"));
+  EXPECT_TRUE(Read32(main, "WM_TRANSIENT_FOR").empty());
+
+  xcb_size_hints_t size{};
+  ASSERT_TRUE(xcb_icccm_get_wm_normal_hints_reply(mUser, xcb_icccm_get_wm_normal_hints(mUser, modal), &size, nullptr));
+  ASSERT_TRUE(size.flags & XCB_ICCCM_SIZE_HINT_P_MAX_SIZE) << "a dialog without a sizing frame keeps its size";
+  EXPECT_EQ(size.min_width, 100);
+  EXPECT_EQ(size.max_width, 100);
+  EXPECT_EQ(size.max_height, 80);
+  mLayer->SetWindowPos(modal, 0, OS_Rect(40, 40, 120, 90), kOSPosNoZOrder | kOSPosNoActivate | kOSPosNoMove);
+  ASSERT_TRUE(xcb_icccm_get_wm_normal_hints_reply(mUser, xcb_icccm_get_wm_normal_hints(mUser, modal), &size, nullptr));
+  EXPECT_EQ(size.max_width, 120) << "the program's own resize moves the limits with it";
+}
+
+TEST_F(X11Protocol, PopupsBypassTheWindowManagerAndAnActivatableOneNoLonger) {
+  const OS_WindowHandle menu = MakeShownWindow(OS_Rect(10, 10, 80, 60), 0x404040, kOSStylePopup,
+                                               kOSExStyleNoActivate | kOSExStyleTopmost);
+  EXPECT_TRUE(IsOverrideRedirect(menu));
+  EXPECT_TRUE(HasAtom(Read32(menu, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_POPUP_MENU"));
+  xcb_icccm_wm_hints_t hints{};
+  ASSERT_TRUE(xcb_icccm_get_wm_hints_reply(mUser, xcb_icccm_get_wm_hints(mUser, menu), &hints, nullptr));
+  EXPECT_FALSE(hints.input) << "a window that never activates takes no focus from the window manager";
+
+  // Made able to activate, it becomes an undecorated window the window manager handles.
+  mLayer->SetExStyle(menu, mLayer->GetExStyle(menu) & ~kOSExStyleNoActivate);
+  Settle(30);
+  EXPECT_FALSE(IsOverrideRedirect(menu));
+  EXPECT_TRUE(HasAtom(Read32(menu, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_NORMAL"));
+  EXPECT_TRUE(mLayer->IsWindowVisible(menu));
+  mLayer->SetActiveWindow(menu);
+  EXPECT_EQ(mLayer->GetActiveWindow(), menu);
+}
+
+// ---- requests and changes from others ----
+
+TEST_F(X11Protocol, TheWindowManagersCloseRequestArrivesAsClose) {
+  const OS_WindowHandle kept = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
+  const OS_WindowHandle closed = MakeShownWindow(OS_Rect(200, 0, 100, 100), 0x222222);
+  mHandler = [&](const RecordedMessage& m) { return m.message == kOSMsgClose && m.window == kept; };
+  SendProtocol(kept, "WM_DELETE_WINDOW");
+  SendProtocol(closed, "WM_DELETE_WINDOW");
+  ASSERT_TRUE(WaitFor([&] { return !mLayer->IsWindow(closed); })) << "the default answer to close destroys";
+  EXPECT_TRUE(mLayer->IsWindow(kept)) << "a window that claims the close stays";
+  const auto closes = MessagesOf(kOSMsgClose);
+  ASSERT_EQ(closes.size(), 2u);
+  EXPECT_EQ(closes[0].window, kept);
+}
+
+TEST_F(X11Protocol, AWindowManagerIconifyingAndRestoringAWindowMinimisesAndRestoresIt) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 120, 90), 0x555555);
+  mMessages.clear();
+  const std::uint32_t iconic[2] = {3, 0};
+  xcb_change_property(mUser, XCB_PROP_MODE_REPLACE, window, UserAtom("WM_STATE"), UserAtom("WM_STATE"), 32, 2, iconic);
+  xcb_unmap_window(mUser, window);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return mLayer->IsMinimized(window); }));
+  EXPECT_FALSE(mLayer->IsWindowVisible(window));
+  ASSERT_FALSE(MessagesOf(kOSMsgSize).empty());
+  EXPECT_EQ(MessagesOf(kOSMsgSize).back().wParam, std::uintptr_t(kOSSizeMinimized));
+
+  const std::uint32_t normal[2] = {1, 0};
+  xcb_change_property(mUser, XCB_PROP_MODE_REPLACE, window, UserAtom("WM_STATE"), UserAtom("WM_STATE"), 32, 2, normal);
+  xcb_map_window(mUser, window);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return !mLayer->IsMinimized(window); }));
+  EXPECT_TRUE(mLayer->IsWindowVisible(window));
+  EXPECT_EQ(MessagesOf(kOSMsgSize).back().wParam, std::uintptr_t(kOSSizeRestored));
+  EXPECT_EQ(PointParamX(MessagesOf(kOSMsgSize).back().lParam), 120);
+}
+
+TEST_F(X11Protocol, AnotherClientHidingOurWindowTakesNoMinimiseButEndsItsGrab) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 120, 90), 0x555555);
+  mLayer->SetCapture(window);
+  mMessages.clear();
+  xcb_unmap_window(mUser, window);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgCaptureChanged); })) << "the lost grab is told";
+  EXPECT_EQ(mLayer->GetCapture(), 0u);
+  EXPECT_FALSE(mLayer->IsMinimized(window)) << "no window manager iconified it";
+  // A new capture works as before.
+  xcb_map_window(mUser, window);
+  xcb_flush(mUser);
+  Settle(30);
+  mLayer->SetCapture(window);
+  MovePointer(900, 700);
+  ASSERT_TRUE(WaitFor([&] {
+    const auto moves = MessagesOf(kOSMsgMouseMove);
+    return !moves.empty() && PointParamX(moves.back().lParam) == 900 - 30;
+  }));
+  EXPECT_EQ(mLayer->GetCapture(), window);
+  mLayer->ReleaseCapture();
+}
+
+TEST_F(X11Protocol, AGrabTakenAgainRightAfterItsReleaseIsNotLostToTheOldOnesEnd) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 120, 90), 0x555555);
+  MovePointer(900, 700);  // outside: ending a grab then tells the window the pointer left it
+  Settle(30);
+  mLayer->SetCapture(window);
+  mLayer->ReleaseCapture();
+  mLayer->SetCapture(window);
+  mMessages.clear();
+  Settle(80);
+  EXPECT_EQ(mLayer->GetCapture(), window);
+  EXPECT_FALSE(Received(kOSMsgCaptureChanged));
+  mLayer->ReleaseCapture();
+}
+
+TEST_F(X11Protocol, ActivationIsAskedOfTheWindowManagerAndFollowsTheFocusItGives) {
+  const OS_WindowHandle first = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
+  const OS_WindowHandle second = MakeShownWindow(OS_Rect(200, 0, 100, 100), 0x222222);
+  mLayer->SetActiveWindow(first);
+  // The user's connection plays the window manager.
+  const std::uint32_t redirect = XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT;
+  xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &redirect);
+  UserSync();
+  mLayer->SetActiveWindow(second);
+  bool asked = false;
+  for (int i = 0; i < 100 && !asked; ++i) {
+    WaitFor([] { return false; }, 5);
+    while (xcb_generic_event_t* event = xcb_poll_for_event(mUser)) {
+      auto* message = reinterpret_cast<xcb_client_message_event_t*>(event);
+      if ((event->response_type & 0x7F) == XCB_CLIENT_MESSAGE && message->type == UserAtom("_NET_ACTIVE_WINDOW"))
+        asked = message->window == second && message->data.data32[0] == 1;
+      std::free(event);
+    }
+  }
+  const std::uint32_t none = 0;
+  xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &none);
+  UserSync();
+  EXPECT_TRUE(asked) << "_NET_ACTIVE_WINDOW went to the root window";
+
+  // The window manager gives the focus to the first window: it becomes active.
+  mMessages.clear();
+  xcb_set_input_focus(mUser, XCB_INPUT_FOCUS_POINTER_ROOT, first, XCB_CURRENT_TIME);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == first; }));
+  EXPECT_FALSE(MessagesOf(kOSMsgActivate).empty());
+  // And to a window of another client: ours are all inactive.
+  xcb_window_t foreign = xcb_generate_id(mUser);
+  xcb_create_window(mUser, XCB_COPY_FROM_PARENT, foreign, mXTest->GetRoot(), 500, 500, 50, 50, 0,
+                    XCB_WINDOW_CLASS_INPUT_OUTPUT, XCB_COPY_FROM_PARENT, 0, nullptr);
+  xcb_map_window(mUser, foreign);
+  UserSync();
+  xcb_set_input_focus(mUser, XCB_INPUT_FOCUS_POINTER_ROOT, foreign, XCB_CURRENT_TIME);
+  xcb_flush(mUser);
+  EXPECT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == 0; }));
+  xcb_destroy_window(mUser, foreign);
+  xcb_flush(mUser);
+}
+
+// ---- desktop settings and the screen ----
+
+// The settings data of a daemon that knows one integer setting.
+std::vector<std::uint8_t> IntegerSetting(const std::string& inName, std::uint32_t inValue, std::uint32_t inSerial) {
+  std::vector<std::uint8_t> data = {0, 0, 0, 0};
+  auto put32 = [&](std::uint32_t v) {
+    for (int i = 0; i < 4; ++i) data.push_back(static_cast<std::uint8_t>(v >> (8 * i)));
+  };
+  put32(inSerial);
+  put32(1);
+  data.push_back(0);  // integer
+  data.push_back(0);
+  data.push_back(static_cast<std::uint8_t>(inName.size()));
+  data.push_back(static_cast<std::uint8_t>(inName.size() >> 8));
+  data.insert(data.end(), inName.begin(), inName.end());
+  while (data.size() % 4) data.push_back(0);
+  put32(inSerial);
+  put32(inValue);
+  return data;
+}
+
+TEST_F(X11Protocol, TheDoubleClickTimeFollowsTheSettingsDaemon) {
+  EXPECT_EQ(mLayer->GetDoubleClickTime(), 500u) << "no daemon: the default";
+  const xcb_atom_t settings = UserAtom("_XSETTINGS_SETTINGS");
+  xcb_window_t daemon = xcb_generate_id(mUser);
+  xcb_create_window(mUser, XCB_COPY_FROM_PARENT, daemon, mXTest->GetRoot(), -10, -10, 1, 1, 0,
+                    XCB_WINDOW_CLASS_INPUT_ONLY, XCB_COPY_FROM_PARENT, 0, nullptr);
+  auto publish = [&](std::uint32_t inValue, std::uint32_t inSerial) {
+    const std::vector<std::uint8_t> data = IntegerSetting("Net/DoubleClickTime", inValue, inSerial);
+    xcb_change_property(mUser, XCB_PROP_MODE_REPLACE, daemon, settings, settings, 8,
+                        static_cast<std::uint32_t>(data.size()), data.data());
+    xcb_flush(mUser);
+  };
+  publish(250, 1);
+  xcb_set_selection_owner(mUser, daemon, UserAtom("_XSETTINGS_S0"), XCB_CURRENT_TIME);
+  xcb_client_message_event_t manager{};
+  manager.response_type = XCB_CLIENT_MESSAGE;
+  manager.format = 32;
+  manager.window = mXTest->GetRoot();
+  manager.type = UserAtom("MANAGER");
+  manager.data.data32[0] = XCB_CURRENT_TIME;
+  manager.data.data32[1] = UserAtom("_XSETTINGS_S0");
+  manager.data.data32[2] = daemon;
+  xcb_send_event(mUser, 0, manager.window, XCB_EVENT_MASK_STRUCTURE_NOTIFY, reinterpret_cast<const char*>(&manager));
+  xcb_flush(mUser);
+  EXPECT_TRUE(WaitFor([&] { return mLayer->GetDoubleClickTime() == 250u; })) << "a daemon that starts later is heard";
+
+  publish(700, 2);
+  EXPECT_TRUE(WaitFor([&] { return mLayer->GetDoubleClickTime() == 700u; })) << "a changed setting is followed";
+
+  xcb_destroy_window(mUser, daemon);
+  xcb_flush(mUser);
+  EXPECT_TRUE(WaitFor([&] { return mLayer->GetDoubleClickTime() == 500u; })) << "the daemon gone: the default";
+}
+
+TEST_F(X11Protocol, OpacityIsTheWindowManagersOpacityHint) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
+  mLayer->SetLayeredAttributes(window, 0, 128, kOSLayeredAlpha);
+  EXPECT_EQ(Read32(window, "_NET_WM_WINDOW_OPACITY"), std::vector<std::uint32_t>{0x80808080u});
+  mLayer->SetLayeredAttributes(window, 0, 255, kOSLayeredAlpha);
+  EXPECT_TRUE(Read32(window, "_NET_WM_WINDOW_OPACITY").empty()) << "opaque windows carry no hint";
+}
+
+TEST_F(X11Protocol, TheWorkAreaComesFromTheDesktopAndBoundsAMaximisedWindow) {
+  const std::uint32_t area[4] = {0, 30, 1024, 700};
+  const xcb_atom_t workArea = UserAtom("_NET_WORKAREA");
+  xcb_change_property(mUser, XCB_PROP_MODE_REPLACE, mXTest->GetRoot(), workArea, XCB_ATOM_CARDINAL, 32, 4, area);
+  UserSync();
+  const std::vector<OS_Monitor> monitors = mLayer->GetMonitors();
+  ASSERT_FALSE(monitors.empty());
+  EXPECT_EQ(monitors[0].workArea, OS_Rect(0, 30, 1024, 700));
+  EXPECT_EQ(monitors[0].bounds, OS_Rect(0, 0, 1024, 768));
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(10, 40, 100, 100), 0x111111);
+  mLayer->ShowWindow(window, kOSShowMaximized);
+  EXPECT_EQ(mLayer->GetWindowRect(window), OS_Rect(0, 30, 1024, 700));
+  xcb_delete_property(mUser, mXTest->GetRoot(), workArea);
+  UserSync();
+}
+
+TEST_F(X11Protocol, AnXErrorIsReportedAndTheLayerGoesOn) {
+  std::vector<tarsel::config::ErrorReport> reports;
+  tarsel::config::ErrorManager* errors = tarsel::config::ErrorManager::Get(true);
+  auto previous = errors->SetReportHandler([&](const tarsel::config::ErrorReport& r) { reports.push_back(r); });
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
+  // A window is no cursor: the server refuses to free it.
+  mLayer->DestroyCursor(static_cast<OS_CursorHandle>(window));
+  const bool reported = WaitFor([&] { return !reports.empty(); });
+  errors->SetReportHandler(previous);
+  ASSERT_TRUE(reported);
+  EXPECT_EQ(reports[0].mKeyPath, "norvik/ui/x11/Error/Protocol");
+  const std::string message = tarsel::utility::UTF16to8(reports[0].mMessage).c_str();
+  EXPECT_NE(message.find("major code 95"), std::string::npos) << message << " (95 is FreeCursor)";
+  EXPECT_TRUE(mLayer->IsWindow(window));
+  mMessages.clear();
+  MovePointer(50, 50);
+  EXPECT_TRUE(WaitFor([&] { return Received(kOSMsgMouseMove); })) << "events still flow";
+}
+
+}  // namespace
+}  // namespace norvik::test
