@@ -1,6 +1,8 @@
 // Real input through XTEST reaching the X11 native layer as the toolkit's messages.
 #include <xkbcommon/xkbcommon-keysyms.h>
 
+#include <cstdlib>
+
 #include "x11/X11Fixture.h"
 
 namespace norvik::test {
@@ -134,6 +136,17 @@ TEST_F(X11Input, TheCursorPositionIsWhereThePointerIsOverOurWindowsAndElsewhere)
   MovePointer(910, 710);
   Settle(50);
   EXPECT_EQ(mLayer->GetCursorPos(), OS_Point(910, 710));
+}
+
+TEST_F(X11Input, MotionsWaitingTogetherArriveAsTheLastOne) {
+  for (int i = 0; i < 20; ++i) MovePointer(120 + i, 150);
+  // Everything has reached the server before the layer looks.
+  std::free(xcb_get_input_focus_reply(mUser, xcb_get_input_focus(mUser), nullptr));
+  Settle(30);
+  const auto moves = MessagesOf(kOSMsgMouseMove);
+  ASSERT_FALSE(moves.empty());
+  EXPECT_LT(moves.size(), 20u);
+  EXPECT_EQ(PointParamX(moves.back().lParam), 139 - 100);
 }
 
 TEST_F(X11Input, LeavingATrackedWindowSendsOneMouseLeave) {

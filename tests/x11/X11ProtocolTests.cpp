@@ -8,6 +8,7 @@
 
 #include <cstdlib>
 #include <cstring>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -71,6 +72,26 @@ class X11Protocol : public X11Fixture {
     message.data.data32[0] = UserAtom(inProtocol);
     xcb_send_event(mUser, 0, message.window, XCB_EVENT_MASK_NO_EVENT, reinterpret_cast<const char*>(&message));
     xcb_flush(mUser);
+  }
+  // The client messages that reach the root window while inAction runs, with
+  // the user's connection playing the window manager.
+  std::vector<xcb_client_message_event_t> RootRequests(const std::function<void()>& inAction) {
+    const std::uint32_t redirect = XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT;
+    xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &redirect);
+    UserSync();
+    inAction();
+    mLayer->ProcessPendingEvents();
+    UserSync();
+    std::vector<xcb_client_message_event_t> messages;
+    while (xcb_generic_event_t* event = xcb_poll_for_event(mUser)) {
+      if ((event->response_type & 0x7F) == XCB_CLIENT_MESSAGE)
+        messages.push_back(*reinterpret_cast<xcb_client_message_event_t*>(event));
+      std::free(event);
+    }
+    const std::uint32_t none = 0;
+    xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &none);
+    UserSync();
+    return messages;
   }
   // The user's round trip: the server has done what the user asked.
   void UserSync() { std::free(xcb_get_input_focus_reply(mUser, xcb_get_input_focus(mUser), nullptr)); }
@@ -230,24 +251,10 @@ TEST_F(X11Protocol, ActivationIsAskedOfTheWindowManagerAndFollowsTheFocusItGives
   const OS_WindowHandle first = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
   const OS_WindowHandle second = MakeShownWindow(OS_Rect(200, 0, 100, 100), 0x222222);
   mLayer->SetActiveWindow(first);
-  // The user's connection plays the window manager.
-  const std::uint32_t redirect = XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT;
-  xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &redirect);
-  UserSync();
-  mLayer->SetActiveWindow(second);
+  const auto requests = RootRequests([&] { mLayer->SetActiveWindow(second); });
   bool asked = false;
-  for (int i = 0; i < 100 && !asked; ++i) {
-    WaitFor([] { return false; }, 5);
-    while (xcb_generic_event_t* event = xcb_poll_for_event(mUser)) {
-      auto* message = reinterpret_cast<xcb_client_message_event_t*>(event);
-      if ((event->response_type & 0x7F) == XCB_CLIENT_MESSAGE && message->type == UserAtom("_NET_ACTIVE_WINDOW"))
-        asked = message->window == second && message->data.data32[0] == 1;
-      std::free(event);
-    }
-  }
-  const std::uint32_t none = 0;
-  xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &none);
-  UserSync();
+  for (const xcb_client_message_event_t& m : requests)
+    if (m.type == UserAtom("_NET_ACTIVE_WINDOW")) asked = m.window == second && m.data.data32[0] == 1;
   EXPECT_TRUE(asked) << "_NET_ACTIVE_WINDOW went to the root window";
 
   // The window manager gives the focus to the first window: it becomes active.
@@ -267,6 +274,58 @@ TEST_F(X11Protocol, ActivationIsAskedOfTheWindowManagerAndFollowsTheFocusItGives
   EXPECT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == 0; }));
   xcb_destroy_window(mUser, foreign);
   xcb_flush(mUser);
+}
+
+TEST_F(X11Protocol, StateChangesOfAShownWindowAreAskedOfTheWindowManager) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 200, 100), 0x111111);
+  auto stateRequests = [&](const std::vector<xcb_client_message_event_t>& inMessages) {
+    std::vector<xcb_client_message_event_t> result;
+    for (const xcb_client_message_event_t& m : inMessages)
+      if (m.type == UserAtom("_NET_WM_STATE") && m.window == window) result.push_back(m);
+    return result;
+  };
+  auto above = stateRequests(RootRequests([&] { mLayer->SetExStyle(window, kOSExStyleTopmost); }));
+  ASSERT_EQ(above.size(), 1u);
+  EXPECT_EQ(above[0].data.data32[0], 1u) << "add";
+  EXPECT_EQ(above[0].data.data32[1], UserAtom("_NET_WM_STATE_ABOVE"));
+  auto removed = stateRequests(RootRequests([&] { mLayer->SetExStyle(window, 0); }));
+  ASSERT_EQ(removed.size(), 1u);
+  EXPECT_EQ(removed[0].data.data32[0], 0u) << "remove";
+  auto maximised = stateRequests(RootRequests([&] { mLayer->ShowWindow(window, kOSShowMaximized); }));
+  ASSERT_EQ(maximised.size(), 1u);
+  EXPECT_EQ(maximised[0].data.data32[1], UserAtom("_NET_WM_STATE_MAXIMIZED_VERT"));
+  EXPECT_EQ(maximised[0].data.data32[2], UserAtom("_NET_WM_STATE_MAXIMIZED_HORZ"));
+  EXPECT_TRUE(stateRequests(RootRequests([&] { mLayer->SetExStyle(window, 0); })).empty())
+      << "nothing changed, nothing asked";
+}
+
+TEST_F(X11Protocol, AWindowResizedByAnotherClientHearsItsNewSizeAndRepaints) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(20, 20, 100, 80), 0x224466);
+  mMessages.clear();
+  const std::uint32_t size[2] = {160, 120};
+  xcb_configure_window(mUser, window, XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT, size);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgSize) && Received(kOSMsgPaint); }));
+  EXPECT_EQ(PointParamX(MessagesOf(kOSMsgSize).back().lParam), 160);
+  EXPECT_EQ(PointParamY(MessagesOf(kOSMsgSize).back().lParam), 120);
+  EXPECT_EQ(mLayer->GetClientRect(window), OS_Rect(0, 0, 160, 120));
+  EXPECT_TRUE(WaitFor([&] { return ReadPixel(window, 150, 110) == 0x224466u; })) << "the new area is painted";
+}
+
+TEST_F(X11Protocol, AWindowUncoveredByAnotherClientsWindowIsRepainted) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(20, 20, 100, 80), 0x336633);
+  xcb_window_t cover = xcb_generate_id(mUser);
+  const std::uint32_t black = 0;
+  xcb_create_window(mUser, XCB_COPY_FROM_PARENT, cover, mXTest->GetRoot(), 40, 40, 40, 40, 0,
+                    XCB_WINDOW_CLASS_INPUT_OUTPUT, XCB_COPY_FROM_PARENT, XCB_CW_BACK_PIXEL, &black);
+  xcb_map_window(mUser, cover);
+  UserSync();
+  Settle(20);
+  mMessages.clear();
+  xcb_destroy_window(mUser, cover);
+  xcb_flush(mUser);
+  ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgPaint); })) << "the exposed part asks for paint";
+  EXPECT_TRUE(WaitFor([&] { return ReadPixel(window, 40, 40) == 0x336633u; }));
 }
 
 // ---- desktop settings and the screen ----

@@ -2,6 +2,8 @@
 
 #include <xcb/xtest.h>
 
+#include <unistd.h>
+
 #include <cstdlib>
 
 namespace norvik::test {
@@ -10,8 +12,26 @@ XTestUser::XTestUser(const std::string& inDisplay) : mConnection(xcb_connect(inD
 
 XTestUser::~XTestUser() {
   if (!mConnection) return;
-  if (IsConnected()) RestoreKeys();
+  if (IsConnected()) {
+    WaitForKeysUp();
+    RestoreKeys();
+  }
   xcb_disconnect(mConnection);
+}
+
+// The server runs faked input through its input queue, after the request
+// that asked for it: a release sent last may still be on its way when a test
+// ends, and would leave the key down for the next one.
+void XTestUser::WaitForKeysUp() {
+  for (int attempt = 0; attempt < 500; ++attempt) {
+    xcb_query_keymap_reply_t* keymap = xcb_query_keymap_reply(mConnection, xcb_query_keymap(mConnection), nullptr);
+    bool anyDown = false;
+    if (keymap)
+      for (std::uint8_t bits : keymap->keys) anyDown = anyDown || bits != 0;
+    std::free(keymap);
+    if (!anyDown) return;
+    usleep(1000);
+  }
 }
 
 xcb_window_t XTestUser::GetRoot() const { return xcb_setup_roots_iterator(xcb_get_setup(mConnection)).data->root; }

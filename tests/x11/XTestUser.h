@@ -36,6 +36,8 @@ class XTestUser {
   // The old mapping of every key changed here comes back in the destructor.
   void MapKey(xcb_keycode_t inKeycode, std::uint32_t inLower, std::uint32_t inUpper);
   void RestoreKeys();
+  // Waits (a second at most) until the server has no key down.
+  void WaitForKeysUp();
 
  private:
   std::vector<std::uint32_t> ReadKey(xcb_keycode_t inKeycode, int& outPerKey);

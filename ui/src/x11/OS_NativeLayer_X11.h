@@ -52,6 +52,7 @@ struct X11Window {
   bool maximized = false;
   bool reparented = false;  // a window manager framed it: its configure positions are frame-relative
   OS_CursorHandle cursor = 0;
+  std::uint32_t netStates = 0;  // the _NET_WM_STATE changes last told, as bits
 
   X11Window() = default;
   X11Window(const X11Window&) = delete;
@@ -239,6 +240,7 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void ApplyIcccmHints(X11Window& ioWindow);
   void ApplySizeHints(X11Window& ioWindow);
   void ApplyWindowState(X11Window& ioWindow);
+  void RequestStateChanges(X11Window& ioWindow);
   // After a style change: bypassing the window manager or not, and the hints.
   void UpdateTopLevelKind(X11Window& ioWindow);
   // windows (X11Windows.cpp)

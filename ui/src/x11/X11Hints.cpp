@@ -84,6 +84,51 @@ void OS_NativeLayer_X11::ApplyWindowState(X11Window& ioWindow) {
   }
   xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, ioWindow.id, Atom("_NET_WM_STATE"), XCB_ATOM_ATOM, 32,
                       static_cast<std::uint32_t>(states.size()), states.data());
+  RequestStateChanges(ioWindow);
+}
+
+namespace {
+
+struct NetState {
+  std::uint32_t bit;
+  const char* first;
+  const char* second;  // changed together with the first, or null
+};
+
+constexpr NetState kChangeableStates[] = {
+    {1, "_NET_WM_STATE_ABOVE", nullptr},
+    {2, "_NET_WM_STATE_MODAL", nullptr},
+    {4, "_NET_WM_STATE_MAXIMIZED_VERT", "_NET_WM_STATE_MAXIMIZED_HORZ"},
+};
+
+}  // namespace
+
+// A window manager reads _NET_WM_STATE only when a window is mapped; a change
+// to a shown window is a request to the root window.
+void OS_NativeLayer_X11::RequestStateChanges(X11Window& ioWindow) {
+  std::uint32_t wanted = 0;
+  if (ioWindow.exStyle & kOSExStyleTopmost) wanted |= 1;
+  if (ioWindow.exStyle & kOSExStyleDialogModalFrame) wanted |= 2;
+  if (ioWindow.maximized) wanted |= 4;
+  const bool shown = (ioWindow.style & kOSStyleVisible) != 0 && !ioWindow.minimized;
+  if (shown && !ioWindow.overrideRedirect && ioWindow.parent == 0) {
+    for (const NetState& state : kChangeableStates) {
+      if (((wanted ^ ioWindow.netStates) & state.bit) == 0) continue;
+      xcb_client_message_event_t message{};
+      message.response_type = XCB_CLIENT_MESSAGE;
+      message.format = 32;
+      message.window = ioWindow.id;
+      message.type = Atom("_NET_WM_STATE");
+      message.data.data32[0] = (wanted & state.bit) ? 1 : 0;  // add or remove
+      message.data.data32[1] = Atom(state.first);
+      message.data.data32[2] = state.second ? Atom(state.second) : 0;
+      message.data.data32[3] = 1;  // from an application
+      xcb_send_event(mConnection, 0, mScreen->root,
+                     XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT | XCB_EVENT_MASK_SUBSTRUCTURE_NOTIFY,
+                     reinterpret_cast<const char*>(&message));
+    }
+  }
+  ioWindow.netStates = wanted;
 }
 
 // WM_HINTS: whether the window manager may give the window the keyboard
