@@ -29,7 +29,9 @@ class LoggingCapture : public InputCapture {
   bool ended = false;
 };
 
-// A view that begins a gesture when pressed, as a slider's thumb does.
+// A view that begins a gesture when pressed, as a slider's thumb does. The
+// view keeps the gesture for the test and the gesture keeps the view, so the
+// test lets go of it at the end (ForgetCapture).
 class DragView : public UI_SubView {
  public:
   bool UI_DoMouseEvent(UI_Node*, const MouseEvent& inEvent) override {
@@ -41,11 +43,17 @@ class DragView : public UI_SubView {
   boost::intrusive_ptr<LoggingCapture> capture;
 };
 
+struct ForgetCapture {
+  ~ForgetCapture() { view->capture.reset(); }
+  DragView* view;
+};
+
 using X11BridgeCapture = X11BridgeTest;
 
 TEST_F(X11BridgeCapture, AGestureFollowsThePointerOutsideItsWindowAndEndsOnRelease) {
   auto window = MakeMainWindow(OS_Rect(100, 100, 300, 200));
   auto thumb = Add(window.get(), new DragView, 50, 40, 40, 40);
+  const ForgetCapture forget{thumb.get()};
   auto other = AddRecorder(window.get(), "other", 200, 0, 100, 200);
   mUser->MovePointer(100 + 60, 100 + 50);
   mUser->Button(1, true);
