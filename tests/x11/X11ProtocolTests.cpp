@@ -80,7 +80,7 @@ class X11Protocol : public X11Fixture {
     xcb_change_window_attributes(mUser, mXTest->GetRoot(), XCB_CW_EVENT_MASK, &redirect);
     UserSync();
     inAction();
-    mLayer->ProcessPendingEvents();
+    SyncLayer();
     UserSync();
     std::vector<xcb_client_message_event_t> messages;
     while (xcb_generic_event_t* event = xcb_poll_for_event(mUser)) {
@@ -93,6 +93,9 @@ class X11Protocol : public X11Fixture {
     UserSync();
     return messages;
   }
+  // The layer's round trip (its monitors are a question with an answer): the
+  // server has done what the layer asked before the user looks.
+  void SyncLayer() { mLayer->GetMonitors(); }
   // The user's round trip: the server has done what the user asked.
   void UserSync() { std::free(xcb_get_input_focus_reply(mUser, xcb_get_input_focus(mUser), nullptr)); }
 };
@@ -122,10 +125,10 @@ TEST_F(X11Protocol, AMainWindowNamesItsClassTakesFocusAndKeepsItsPlace) {
   // The node property marks the window as the toolkit's for other clients too.
   int node = 0;
   mLayer->SetProperty(main, "norvik::ui::OS_Window::property", &node);
-  mLayer->ProcessPendingEvents();  // sends what is buffered
+  SyncLayer();
   EXPECT_FALSE(Read32(main, "norvik::ui::OS_Window::property").empty());
   mLayer->RemoveProperty(main, "norvik::ui::OS_Window::property");
-  mLayer->ProcessPendingEvents();
+  SyncLayer();
   EXPECT_TRUE(Read32(main, "norvik::ui::OS_Window::property").empty());
 }
 
@@ -150,6 +153,7 @@ TEST_F(X11Protocol, OwnedAndModalWindowsAreTransientDialogs) {
   EXPECT_EQ(size.max_width, 100);
   EXPECT_EQ(size.max_height, 80);
   mLayer->SetWindowPos(modal, 0, OS_Rect(40, 40, 120, 90), kOSPosNoZOrder | kOSPosNoActivate | kOSPosNoMove);
+  SyncLayer();
   ASSERT_TRUE(xcb_icccm_get_wm_normal_hints_reply(mUser, xcb_icccm_get_wm_normal_hints(mUser, modal), &size, nullptr));
   EXPECT_EQ(size.max_width, 120) << "the program's own resize moves the limits with it";
 }
@@ -165,7 +169,7 @@ TEST_F(X11Protocol, PopupsBypassTheWindowManagerAndAnActivatableOneNoLonger) {
 
   // Made able to activate, it becomes an undecorated window the window manager handles.
   mLayer->SetExStyle(menu, mLayer->GetExStyle(menu) & ~kOSExStyleNoActivate);
-  Settle(30);
+  SyncLayer();
   EXPECT_FALSE(IsOverrideRedirect(menu));
   EXPECT_TRUE(HasAtom(Read32(menu, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_NORMAL"));
   EXPECT_TRUE(mLayer->IsWindowVisible(menu));
@@ -221,8 +225,7 @@ TEST_F(X11Protocol, AnotherClientHidingOurWindowTakesNoMinimiseButEndsItsGrab) {
   EXPECT_FALSE(mLayer->IsMinimized(window)) << "no window manager iconified it";
   // A new capture works as before.
   xcb_map_window(mUser, window);
-  xcb_flush(mUser);
-  Settle(30);
+  UserSync();  // viewable again before the layer grabs
   mLayer->SetCapture(window);
   MovePointer(900, 700);
   ASSERT_TRUE(WaitFor([&] {
@@ -236,7 +239,7 @@ TEST_F(X11Protocol, AnotherClientHidingOurWindowTakesNoMinimiseButEndsItsGrab) {
 TEST_F(X11Protocol, AGrabTakenAgainRightAfterItsReleaseIsNotLostToTheOldOnesEnd) {
   const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 120, 90), 0x555555);
   MovePointer(900, 700);  // outside: ending a grab then tells the window the pointer left it
-  Settle(30);
+  ASSERT_TRUE(WaitFor([&] { return mLayer->GetCursorPos() == OS_Point(900, 700); }));
   mLayer->SetCapture(window);
   mLayer->ReleaseCapture();
   mLayer->SetCapture(window);
@@ -386,8 +389,10 @@ TEST_F(X11Protocol, TheDoubleClickTimeFollowsTheSettingsDaemon) {
 TEST_F(X11Protocol, OpacityIsTheWindowManagersOpacityHint) {
   const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 100, 100), 0x111111);
   mLayer->SetLayeredAttributes(window, 0, 128, kOSLayeredAlpha);
+  SyncLayer();
   EXPECT_EQ(Read32(window, "_NET_WM_WINDOW_OPACITY"), std::vector<std::uint32_t>{0x80808080u});
   mLayer->SetLayeredAttributes(window, 0, 255, kOSLayeredAlpha);
+  SyncLayer();
   EXPECT_TRUE(Read32(window, "_NET_WM_WINDOW_OPACITY").empty()) << "opaque windows carry no hint";
 }
 
