@@ -31,6 +31,20 @@ bool ReadDimension(const std::string& inText, long inMin, long inMax, long& outV
 
 }  // namespace
 
+const char* GalleryPageName(GalleryPageID inPage) {
+  return inPage == GalleryPageID::kButtons ? "buttons" : "basics";
+}
+
+bool ReadGalleryPageName(const std::string& inName, GalleryPageID& outPage) {
+  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons}) {
+    if (inName == GalleryPageName(page)) {
+      outPage = page;
+      return true;
+    }
+  }
+  return false;
+}
+
 bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions& outOptions, std::string& outError) {
   bool sawLook = false;
   for (std::size_t i = 0; i < inArgs.size(); ++i) {
@@ -47,7 +61,7 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
       }
       sawLook = true;
       outOptions.light = light;
-    } else if (arg == "--screenshot" || arg == "--size") {
+    } else if (arg == "--screenshot" || arg == "--size" || arg == "--page") {
       if (i + 1 >= inArgs.size() || inArgs[i + 1].empty() || inArgs[i + 1].rfind("--", 0) == 0) {
         outError = Localized("$$$/norvik/gallery/Error/MissingValue=^0 needs a value.", arg);
         return false;
@@ -55,6 +69,12 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
       const std::string& value = inArgs[++i];
       if (arg == "--screenshot") {
         outOptions.screenshot = value;
+      } else if (arg == "--page") {
+        if (!ReadGalleryPageName(value, outOptions.page)) {
+          outError = Localized("$$$/norvik/gallery/Error/BadPage=There is no page ^0: the pages are basics and buttons.",
+                               value);
+          return false;
+        }
       } else {
         const std::size_t x = value.find_first_of("xX");
         long w = 0, h = 0;
@@ -86,6 +106,7 @@ std::string GalleryUsage() {
       "  --light            start in the light look\n"
       "  --dark             start in the dark look (the default)\n"
       "  --size WxH         client size of the window in pixels (default 1120x720)\n"
+      "  --page NAME        start on the page NAME: basics (the default) or buttons\n"
       "  --exit-after-first-frame  exit once the first frame is shown, printing the time it took\n"
       "  --help             show this text\n");
 }

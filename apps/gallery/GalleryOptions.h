@@ -5,9 +5,16 @@
 
 namespace norvik::gallery {
 
+// The pages of the gallery, and their names on the command line.
+enum class GalleryPageID { kBasics, kButtons };
+const char* GalleryPageName(GalleryPageID inPage);
+// False, leaving outPage alone, for a name that is no page.
+bool ReadGalleryPageName(const std::string& inName, GalleryPageID& outPage);
+
 struct GalleryOptions {
   std::string screenshot;  // write this PNG and exit; empty: show a window when a display opens
   bool light = false;
+  GalleryPageID page = GalleryPageID::kBasics;
   long width = 1120;
   long height = 720;
   bool help = false;

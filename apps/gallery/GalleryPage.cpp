@@ -1,18 +1,13 @@
 #include "GalleryPage.h"
 
-#include "ControlsView.h"
+#include "BasicsView.h"
+#include "ButtonsView.h"
+#include "PageSelector.h"
 
 #include <algorithm>
 #include <cmath>
 
 namespace norvik::gallery {
-
-namespace {
-
-const char* const kSectionIDs[] = {"section-colours", "section-drawing", "section-tree", "section-focus",
-                                   "section-controls"};
-
-}  // namespace
 
 GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mTheme(std::move(inTheme)), mLight(inLight) {
   UI_SetNodeID("gallery-page");
@@ -26,23 +21,28 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   mSwitch->SetChangeFunction([this](bool inLight) { SetLight(inLight); });
   AddGalleryChild(this, mSwitch);
 
-  const char* const titles[] = {"$$$/norvik/gallery/Section/Colours=Theme colours",
-                                "$$$/norvik/gallery/Section/Drawing=Drawing",
-                                "$$$/norvik/gallery/Section/Tree=Node tree and hover",
-                                "$$$/norvik/gallery/Section/Focus=Keyboard focus",
-                                "$$$/norvik/gallery/Section/Controls=Controls"};
-  mContents = {ui::UI_NodeP(new SwatchView()), ui::UI_NodeP(new DrawingSamplesView()),
-               ui::UI_NodeP(new NodeTreeView()), ui::UI_NodeP(new FocusDemoView()),
-               ui::UI_NodeP(new ControlsView())};
-  mFocusDemo = mContents[3];
-  for (std::size_t i = 0; i < mContents.size(); ++i) {
-    boost::intrusive_ptr<SectionView> section(new SectionView(titles[i]));
-    section->UI_SetNodeID(kSectionIDs[i]);
-    AddGalleryChild(this, section);
-    AddGalleryChild(section.get(), mContents[i]);
-    mSections.push_back(section);
-  }
+  auto* selector = new PageSelector();
+  mSelector.reset(selector);
+  selector->SetChangeFunction([this](GalleryPageID inPage) { ShowPage(inPage); });
+  AddGalleryChild(this, mSelector);
+  mBasics.reset(new BasicsView());
+  AddGalleryChild(this, mBasics);
+  mButtons.reset(new ButtonsView());
+  AddGalleryChild(this, mButtons);
+  mButtons->UI_Show(false);
 }
+
+void GalleryPage::ShowPage(GalleryPageID inPage) {
+  mShown = inPage;
+  GetPageSelector()->Select(inPage);
+  mBasics->UI_Show(inPage == GalleryPageID::kBasics);
+  mButtons->UI_Show(inPage == GalleryPageID::kButtons);
+  UI_Invalidate(nullptr, 0);
+}
+
+PageSelector* GalleryPage::GetPageSelector() const { return static_cast<PageSelector*>(mSelector.get()); }
+
+ButtonsView* GalleryPage::GetButtonsPage() const { return static_cast<ButtonsView*>(mButtons.get()); }
 
 void GalleryPage::SetLight(bool inLight) {
   mLight = inLight;
@@ -52,16 +52,10 @@ void GalleryPage::SetLight(bool inLight) {
   UI_Invalidate(nullptr, 0);
 }
 
-SectionView* GalleryPage::GetSection(const char* inID) {
-  for (auto& s : mSections)
-    if (s->UI_GetNodeID() == inID) return s.get();
-  return nullptr;
-}
+SectionView* GalleryPage::GetSection(const char* inID) { return static_cast<BasicsView*>(mBasics.get())->GetSection(inID); }
 
 std::vector<ui::UI_Node*> GalleryPage::GetFocusTiles() const {
-  std::vector<ui::UI_Node*> tiles;
-  for (auto it = mFocusDemo->ChildBegin(); it != mFocusDemo->ChildEnd(); ++it) tiles.push_back(it->get());
-  return tiles;
+  return static_cast<BasicsView*>(mBasics.get())->GetFocusTiles();
 }
 
 bool GalleryPage::UI_AreAllParentsVisible() const {
@@ -77,23 +71,11 @@ void GalleryPage::Arrange() {
   const RectF r = UI_GetLocalRectF(false);
   mHeader->UI_SetLocalRectF(RectF(0, 0, r.width, kHeaderHeight));
   mSwitch->UI_SetLocalRectF(RectF(std::max(0.0f, r.width - kMargin - 140), (kHeaderHeight - 28) / 2, 140, 28));
-  const float gap = 12;
-  const float top = kHeaderHeight + kMargin;
-  const float w = std::floor(std::max(0.0f, (r.width - 2 * kMargin - gap) / 2));
-  const float avail = std::max(0.0f, r.height - top - kMargin - gap);
-  // The top row is as tall as the colours and drawing need; the bottom row
-  // takes the rest. On the right of it, focus above controls.
-  const float topH = std::floor(std::min(220.0f, avail / 2));
-  const float bottomH = std::floor(avail - topH);
-  const float focusH = std::floor(std::min(124.0f, std::max(0.0f, (bottomH - gap) / 2)));
-  const float left = kMargin, right = kMargin + w + gap, bottom = top + topH + gap;
-  const RectF frames[] = {RectF(left, top, w, topH), RectF(right, top, w, topH), RectF(left, bottom, w, bottomH),
-                          RectF(right, bottom, w, focusH),
-                          RectF(right, bottom + focusH + gap, w, std::max(0.0f, bottomH - focusH - gap))};
-  for (std::size_t i = 0; i < mSections.size(); ++i) {
-    mSections[i]->UI_SetLocalRectF(frames[i]);
-    mContents[i]->UI_SetLocalRectF(mSections[i]->ContentRect());
-  }
+  mSelector->UI_SetLocalRectF(RectF(kMargin, kHeaderHeight + 4, GetPageSelector()->GetPreferredWidth(), kSelectorHeight - 4));
+  const float top = kHeaderHeight + kSelectorHeight + 4;
+  const RectF body(kMargin, top, std::max(0.0f, r.width - 2 * kMargin), std::max(0.0f, r.height - top - kMargin));
+  mBasics->UI_SetLocalRectF(body);
+  mButtons->UI_SetLocalRectF(body);
 }
 
 void GalleryPage::UI_Draw(drawbot::Drawbot* inDrawbot) {

@@ -1,12 +1,18 @@
 #pragma once
 // The gallery's page: the root node of the window's contents. A header with
-// the title and the brightness switch, then one panel per section. The page
-// owns its look: switching between dark and light sets the theme's
+// the title and the brightness switch, a row that picks the page on show,
+// then that page: the basics (one panel per section) or the buttons. The
+// page owns its look: switching between dark and light sets the theme's
 // brightness, tells the theme's clients, and repaints.
+#include "GalleryOptions.h"
 #include "GalleryViews.h"
 #include "ui/KeyframeThemeEditor.h"
 
 namespace norvik::gallery {
+
+class BasicsView;
+class ButtonsView;
+class PageSelector;
 
 class GalleryPage : public ui::UI_SubView {
  public:
@@ -16,7 +22,14 @@ class GalleryPage : public ui::UI_SubView {
   void SetLight(bool inLight);
   bool IsLight() const { return mLight; }
 
+  // Shows inPage and hides the other, as a choice in the selector row does.
+  void ShowPage(GalleryPageID inPage);
+  GalleryPageID GetShownPage() const { return mShown; }
+
   BrightnessSwitch* GetBrightnessSwitch() const { return mSwitch.get(); }
+  PageSelector* GetPageSelector() const;
+  ButtonsView* GetButtonsPage() const;
+  // A section of the basics page.
   SectionView* GetSection(const char* inID);
   // The tiles of the focus section, in tab order.
   std::vector<ui::UI_Node*> GetFocusTiles() const;
@@ -27,6 +40,7 @@ class GalleryPage : public ui::UI_SubView {
   void UI_SizeChanged(const RectF& inLocalRect) override;
 
   static constexpr float kHeaderHeight = 48;
+  static constexpr float kSelectorHeight = 30;
   static constexpr float kMargin = 14;
   // The smallest size the sections still fit in.
   static constexpr long kMinWidth = 560;
@@ -38,9 +52,10 @@ class GalleryPage : public ui::UI_SubView {
   bool mLight;
   ui::UI_NodeP mHeader;
   boost::intrusive_ptr<BrightnessSwitch> mSwitch;
-  std::vector<boost::intrusive_ptr<SectionView>> mSections;
-  std::vector<ui::UI_NodeP> mContents;
-  ui::UI_NodeP mFocusDemo;
+  ui::UI_NodeP mSelector;
+  ui::UI_NodeP mBasics;
+  ui::UI_NodeP mButtons;
+  GalleryPageID mShown = GalleryPageID::kBasics;
 };
 
 using GalleryPageP = boost::intrusive_ptr<GalleryPage>;

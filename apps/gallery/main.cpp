@@ -10,6 +10,7 @@
 
 #include "GalleryOptions.h"
 #include "GalleryPage.h"
+#include "GalleryResources.h"
 #include "GalleryWindow.h"
 #include "tarsel/ThrowError.h"
 #include "ui/HeadlessWindowSystem.h"
@@ -48,6 +49,7 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
   int result = gallery::kExitOK;
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
+    page->ShowPage(inOptions.page);
     gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
     if (inOptions.exitAfterFirstFrame) window->SetFirstFrameFunction(&ReportFirstFrame);
     system.Pump();
@@ -71,6 +73,7 @@ int ShowOnDisplay(ui::OS_NativeLayer& inLayer, const gallery::GalleryOptions& in
   int result = gallery::kExitOK;
   {
     gallery::GalleryPageP page(new gallery::GalleryPage(inTheme, inOptions.light));
+    page->ShowPage(inOptions.page);
     gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
     if (inOptions.exitAfterFirstFrame)
       window->SetFirstFrameFunction([&inLayer] {
@@ -98,6 +101,7 @@ int main(int argc, char** argv) {
   }
   try {
     ui::OS_NodeManager manager;
+    gallery::ProvideImageResources(manager);
     ui::KeyframeThemeEditorP theme = ui::MakeDefaultKeyframeTheme();
     ui::Theme::Initialize(theme);
     std::string path = options.screenshot;

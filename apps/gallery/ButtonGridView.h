@@ -1,0 +1,36 @@
+#pragma once
+// A table of state samples: a row per kind of button, a column per state,
+// with the kinds named down the left and the states across the top. A cell
+// whose state the kind does not have stays empty.
+#include <vector>
+
+#include "ButtonSamples.h"
+#include "ui/UI_SubView.h"
+
+namespace norvik::gallery {
+
+class ButtonGridView : public ui::UI_SubView {
+ public:
+  ButtonGridView();
+
+  // The sample of inKind in inState, or null where the kind lacks the state.
+  ui::UI_Node* GetSample(ButtonKind inKind, ShownState inState) const;
+  // The cell of a kind and state, local to the grid.
+  RectF GetCellRect(ButtonKind inKind, ShownState inState) const;
+  int GetSampleCount() const;
+
+  void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+  void UI_SizeChanged(const RectF& inLocalRect) override;
+
+  static constexpr float kLabelWidth = 150;
+  static constexpr float kHeadingHeight = 22;
+
+ private:
+  void Arrange();
+  float RowHeight() const;
+  float ColumnWidth() const;
+  std::vector<std::vector<controls::UI_ButtonP>> mSamples;  // [kind][state]
+  ui::UI_NodeP mRadioGroup;                                  // holds the radio row
+};
+
+}  // namespace norvik::gallery

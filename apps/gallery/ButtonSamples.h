@@ -1,0 +1,48 @@
+#pragma once
+// The kinds of button the Buttons page shows and the states it shows them
+// in. A live button of a kind behaves as in any program; a state sample is
+// the same control frozen in one state, so that every state can be seen at
+// once: its value, down state and enabled state are set through the
+// control's own setters, and rollover and focus, which the node tree gives
+// to one node at a time, are answered by the sample itself. A sample takes
+// no mouse events and no focus, so nothing a user does changes it.
+#include "GalleryStyle.h"
+#include "controls/UI_Button.h"
+
+namespace norvik::gallery {
+
+enum class ButtonKind {
+  kText,
+  kDefaultText,
+  kPicture,
+  kPictureText,
+  kLock,
+  kLink,
+  kOwnerDraw,
+  kDisclosure,
+  kCheckbox,
+  kTriStateCheckbox,
+  kRadio,
+};
+constexpr int kButtonKindCount = 11;
+
+enum class ShownState { kNormal, kRollover, kPressed, kOn, kMixed, kFocused, kDisabled, kDisabledOn };
+constexpr int kShownStateCount = 8;
+
+inline ButtonKind KindAt(int inIndex) { return static_cast<ButtonKind>(inIndex); }
+inline ShownState StateAt(int inIndex) { return static_cast<ShownState>(inIndex); }
+
+UTF16String ButtonKindName(ButtonKind inKind);
+UTF16String ShownStateName(ShownState inState);
+// Whether a button of inKind has inState: "on" only for buttons that keep a
+// value, "mixed" only for the tri-state checkbox.
+bool KindShowsState(ButtonKind inKind, ShownState inState);
+// The size a button of inKind takes in the page.
+PointF ButtonSize(ButtonKind inKind);
+
+// A working button of inKind, with its label, picture and settings.
+controls::UI_ButtonP MakeLiveButton(ButtonKind inKind);
+// A button of inKind frozen in inState.
+controls::UI_ButtonP MakeStateSample(ButtonKind inKind, ShownState inState);
+
+}  // namespace norvik::gallery

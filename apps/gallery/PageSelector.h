@@ -1,0 +1,36 @@
+#pragma once
+// The row at the top of the gallery that picks the page on show: one choice
+// per page, made of the toolkit's own controls. A user's choice calls the
+// change function; Select sets the choice without calling it.
+#include <functional>
+
+#include "GalleryOptions.h"
+#include "GalleryStyle.h"
+#include "ui/UI_SubView.h"
+
+namespace norvik::gallery {
+
+class PageSelector : public ui::UI_SubView {
+ public:
+  using ChangeFunction = std::function<void(GalleryPageID inPage)>;
+
+  PageSelector();
+  void Select(GalleryPageID inPage);
+  GalleryPageID GetSelected() const;
+  void SetChangeFunction(ChangeFunction inF) { mChange = std::move(inF); }
+  // The control a user clicks to choose inPage.
+  ui::UI_Node* GetChoice(GalleryPageID inPage) const;
+  // The width the choices need side by side.
+  float GetPreferredWidth() const;
+
+  void UI_SizeChanged(const RectF& inLocalRect) override;
+
+ private:
+  void Arrange();
+  void ChoiceMade();
+  ui::UI_NodeP mGroup;
+  ui::UI_NodeP mChoices[2];
+  ChangeFunction mChange;
+};
+
+}  // namespace norvik::gallery
