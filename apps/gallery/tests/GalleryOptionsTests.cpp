@@ -26,6 +26,7 @@ TEST(GalleryOptions, NoArgumentsShowAWindowInTheDarkLookAtTheDefaultSize) {
   EXPECT_FALSE(p.options.help);
   EXPECT_EQ(p.options.width, 1120);
   EXPECT_EQ(p.options.height, 720);
+  EXPECT_EQ(p.options.page, GalleryPageID::kBasics);
 }
 
 TEST(GalleryOptions, ScreenshotLookAndSizeAreRead) {
@@ -84,6 +85,42 @@ TEST(GalleryOptions, LightAndDarkTogetherAreRefusedButRepeatingOneIsNot) {
   Parsed twice = Parse({"--light", "--light"});
   EXPECT_TRUE(twice.ok);
   EXPECT_TRUE(twice.options.light);
+}
+
+TEST(GalleryOptions, PageNamesEitherPageAndTheLastOneCounts) {
+  Parsed buttons = Parse({"--screenshot", "/tmp/b.png", "--page", "buttons", "--light"});
+  ASSERT_TRUE(buttons.ok) << buttons.error;
+  EXPECT_EQ(buttons.options.page, GalleryPageID::kButtons);
+  EXPECT_TRUE(buttons.options.light);
+  EXPECT_EQ(buttons.options.screenshot, "/tmp/b.png");
+  Parsed back = Parse({"--page", "buttons", "--page", "basics"});
+  ASSERT_TRUE(back.ok);
+  EXPECT_EQ(back.options.page, GalleryPageID::kBasics);
+  EXPECT_NE(GalleryUsage().find("--page"), std::string::npos);
+}
+
+TEST(GalleryOptions, AnUnknownPageIsRefusedWithItsNameAndThePagesThereAre) {
+  for (const char* name : {"Buttons", "button", "sliders", " buttons", "buttons2"}) {
+    Parsed p = Parse({"--page", name});
+    EXPECT_FALSE(p.ok) << name;
+    EXPECT_NE(p.error.find(std::string("page ") + name + ":"), std::string::npos) << p.error;
+    EXPECT_NE(p.error.find("basics and buttons"), std::string::npos) << p.error;
+  }
+  Parsed missing = Parse({"--page"});
+  EXPECT_FALSE(missing.ok);
+  EXPECT_NE(missing.error.find("--page"), std::string::npos) << missing.error;
+  EXPECT_FALSE(Parse({"--page", "--light"}).ok) << "the next option is no page name";
+}
+
+TEST(GalleryOptions, PageNamesReadBackAsThemselves) {
+  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons}) {
+    GalleryPageID read = page == GalleryPageID::kBasics ? GalleryPageID::kButtons : GalleryPageID::kBasics;
+    ASSERT_TRUE(ReadGalleryPageName(GalleryPageName(page), read));
+    EXPECT_EQ(read, page);
+  }
+  GalleryPageID untouched = GalleryPageID::kButtons;
+  EXPECT_FALSE(ReadGalleryPageName("", untouched));
+  EXPECT_EQ(untouched, GalleryPageID::kButtons);
 }
 
 }  // namespace

@@ -90,10 +90,40 @@ TEST_F(GalleryProgram, ExitAfterFirstFrameTellsTheTimeToTheFirstFrame) {
   EXPECT_TRUE(ReadPNGSize(path, w, h)) << "the image is still written";
 }
 
+TEST_F(GalleryProgram, PageButtonsRendersTheButtonsPageInEitherLook) {
+  const std::string basics = (dir / "basics-light.png").string(), buttons = (dir / "buttons-light.png").string(),
+                    dark = (dir / "buttons-dark.png").string();
+  ASSERT_EQ(RunGallery("--screenshot '" + basics + "' --light").exitCode, 0);
+  ProgramRun run = RunGallery("--screenshot '" + buttons + "' --page buttons --light");
+  EXPECT_EQ(run.exitCode, 0) << run.output;
+  EXPECT_NE(run.output.find(buttons), std::string::npos) << run.output;
+  ASSERT_EQ(RunGallery("--page buttons --screenshot '" + dark + "'").exitCode, 0);
+  unsigned w = 0, h = 0;
+  ASSERT_TRUE(ReadPNGSize(buttons, w, h));
+  EXPECT_EQ(w, 1120u);
+  EXPECT_EQ(h, 720u);
+  auto bytes = [](const std::string& inPath) {
+    std::ifstream in(inPath, std::ios::binary);
+    return std::string((std::istreambuf_iterator<char>(in)), {});
+  };
+  EXPECT_NE(bytes(basics), bytes(buttons)) << "another page";
+  EXPECT_NE(bytes(buttons), bytes(dark)) << "another look";
+}
+
+TEST_F(GalleryProgram, AnUnknownPageExitsTwoNamingItAndWritesNothing) {
+  const std::string path = (dir / "no-page.png").string();
+  std::filesystem::remove(path);
+  ProgramRun run = RunGallery("--screenshot '" + path + "' --page sliders");
+  EXPECT_EQ(run.exitCode, 2);
+  EXPECT_NE(run.output.find("norvik-gallery: There is no page sliders"), std::string::npos) << run.output;
+  EXPECT_FALSE(std::filesystem::exists(path));
+}
+
 TEST_F(GalleryProgram, HelpPrintsTheOptionsAndExitsZero) {
   ProgramRun run = RunGallery("--help");
   EXPECT_EQ(run.exitCode, 0);
-  for (const char* option : {"--screenshot", "--light", "--dark", "--size", "--exit-after-first-frame", "--help"})
+  for (const char* option :
+       {"--screenshot", "--light", "--dark", "--size", "--exit-after-first-frame", "--page", "--help"})
     EXPECT_NE(run.output.find(option), std::string::npos) << option;
 }
 

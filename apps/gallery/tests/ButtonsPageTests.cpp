@@ -1,0 +1,299 @@
+// The Buttons page in a headless window: every kind of button in every state
+// it has, each state visibly unlike the normal one in both looks; the page
+// selector switched by clicks; the live buttons reporting on the status line.
+#include <filesystem>
+#include <memory>
+
+#include <gtest/gtest.h>
+
+#include "ButtonsView.h"
+#include "GalleryPage.h"
+#include "GalleryResources.h"
+#include "GalleryWindow.h"
+#include "PageSelector.h"
+#include "controls/UI_Checkbox.h"
+#include "controls/UI_RadioGroup.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/OS_NodeManager.h"
+#include "ui/Theme.h"
+
+namespace norvik::gallery {
+namespace {
+
+using RectL = ui::UI_Node::RectL;
+
+int Luma(std::uint32_t inPixel) {
+  return (static_cast<int>((inPixel >> 16) & 0xFF) * 3 + static_cast<int>((inPixel >> 8) & 0xFF) * 6 +
+          static_cast<int>(inPixel & 0xFF)) /
+         10;
+}
+
+// How many pixels of inRect differ between two images of one window.
+int CountDifferences(const ui::HeadlessPixels& inA, const RectL& inRectA, const ui::HeadlessPixels& inB,
+                     const RectL& inRectB) {
+  int count = 0;
+  for (long y = 0; y < std::min(inRectA.height, inRectB.height); ++y)
+    for (long x = 0; x < std::min(inRectA.width, inRectB.width); ++x)
+      count += inA.At(static_cast<int>(inRectA.left + x), static_cast<int>(inRectA.top + y)) !=
+                       inB.At(static_cast<int>(inRectB.left + x), static_cast<int>(inRectB.top + y))
+                   ? 1
+                   : 0;
+  return count;
+}
+
+// The spread of brightness within inRect: 0 for a flat area.
+int LumaSpread(const ui::HeadlessPixels& inPixels, const RectL& inRect) {
+  int lo = 255, hi = 0;
+  for (long y = inRect.top; y < inRect.top + inRect.height; ++y)
+    for (long x = inRect.left; x < inRect.left + inRect.width; ++x) {
+      const int l = Luma(inPixels.At(static_cast<int>(x), static_cast<int>(y)));
+      lo = std::min(lo, l);
+      hi = std::max(hi, l);
+    }
+  return hi - lo;
+}
+
+RectL OnPage(const ui::UI_Node* inNode, const RectF& inLocal) {
+  return inNode->UI_LocalToGlobal(RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
+                                        static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));
+}
+
+class ButtonsPageTest : public ::testing::Test {
+ protected:
+  void Open(bool inLight, long inWidth = 1120, long inHeight = 720) {
+    ProvideImageResources(manager);
+    theme = ui::MakeDefaultKeyframeTheme();
+    ui::Theme::Initialize(theme);
+    system.Install();
+    page.reset(new GalleryPage(theme, inLight));
+    window = std::make_unique<GalleryWindow>(system.GetLayer(), page, inWidth, inHeight);
+    system.Pump();
+  }
+  void TearDown() override {
+    if (HasFailure() && window) {
+      const std::filesystem::path dir = std::filesystem::path(NORVIK_TEST_OUTPUT_DIR) / "buttons-page";
+      std::filesystem::create_directories(dir);
+      const std::string name = ::testing::UnitTest::GetInstance()->current_test_info()->name();
+      system.WriteWindowPNG(window->GetHandle(), (dir / (name + ".png")).string());
+    }
+    window.reset();
+    page.reset();
+    system.Uninstall();
+    ui::Theme::Terminate();
+  }
+  ui::HeadlessPixels Pixels() {
+    system.Pump();
+    return system.ReadWindowPixels(window->GetHandle());
+  }
+  void ClickAt(const ui::UI_Node* inNode, long inX, long inY) {
+    const RectL onPage = inNode->UI_LocalToGlobal(RectL(inX, inY, 1, 1));
+    system.AdvanceClock(1000);  // past the double-click time: each click is a single one
+    system.Click(system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(onPage.left, onPage.top)));
+    system.Pump();
+  }
+  void Click(const ui::UI_Node* inNode) {
+    const RectF r = inNode->UI_GetLocalRectF(false);
+    ClickAt(inNode, static_cast<long>(r.width / 2), static_cast<long>(r.height / 2));
+  }
+  ButtonGridView* Grid() const { return page->GetButtonsPage()->GetGrid(); }
+  LiveButtonsView* Live() const { return page->GetButtonsPage()->GetLiveButtons(); }
+  RectL Cell(ButtonKind inKind, ShownState inState) const {
+    return OnPage(Grid(), Grid()->GetCellRect(inKind, inState));
+  }
+
+  ui::OS_NodeManager manager;
+  ui::HeadlessWindowSystem system;
+  ui::KeyframeThemeEditorP theme;
+  GalleryPageP page;
+  std::unique_ptr<GalleryWindow> window;
+};
+
+TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {
+  Open(false);
+  page->ShowPage(GalleryPageID::kButtons);
+  int samples = 0;
+  for (int k = 0; k < kButtonKindCount; ++k) {
+    for (int s = 0; s < kShownStateCount; ++s) {
+      ui::UI_Node* sample = Grid()->GetSample(KindAt(k), StateAt(s));
+      EXPECT_EQ(sample != nullptr, KindShowsState(KindAt(k), StateAt(s))) << "kind " << k << " state " << s;
+      if (!sample) continue;
+      ++samples;
+      const RectL cell = Cell(KindAt(k), StateAt(s));
+      const RectL frame = OnPage(sample, sample->UI_GetLocalRectF(false));
+      EXPECT_GT(frame.width, 10) << "kind " << k << " state " << s;
+      EXPECT_GE(frame.left, cell.left) << "kind " << k << " state " << s;
+      EXPECT_GE(frame.top, cell.top) << "kind " << k << " state " << s;
+      EXPECT_LE(frame.left + frame.width, cell.left + cell.width) << "kind " << k << " state " << s;
+      EXPECT_LE(frame.top + frame.height, cell.top + cell.height) << "kind " << k << " state " << s;
+    }
+  }
+  EXPECT_EQ(samples, Grid()->GetSampleCount());
+  EXPECT_GE(samples, 60);
+  // The grid and the live buttons fit the window at the program's size.
+  const RectL grid = OnPage(Grid(), Grid()->UI_GetLocalRectF(false));
+  const RectL last = Cell(KindAt(kButtonKindCount - 1), StateAt(kShownStateCount - 1));
+  EXPECT_LE(last.top + last.height, grid.top + grid.height);
+  EXPECT_LE(last.left + last.width, grid.left + grid.width);
+  const RectL live = OnPage(Live(), Live()->UI_GetLocalRectF(false));
+  EXPECT_LE(live.top + live.height, 720);
+  EXPECT_GE(live.top, grid.top + grid.height);
+}
+
+TEST_F(ButtonsPageTest, TheSelectedStateIsOnlyForButtonsThatKeepAValue) {
+  EXPECT_FALSE(KindShowsState(ButtonKind::kText, ShownState::kOn));
+  EXPECT_FALSE(KindShowsState(ButtonKind::kPicture, ShownState::kDisabledOn));
+  EXPECT_TRUE(KindShowsState(ButtonKind::kLock, ShownState::kOn));
+  EXPECT_TRUE(KindShowsState(ButtonKind::kRadio, ShownState::kDisabledOn));
+  EXPECT_TRUE(KindShowsState(ButtonKind::kTriStateCheckbox, ShownState::kMixed));
+  EXPECT_FALSE(KindShowsState(ButtonKind::kCheckbox, ShownState::kMixed));
+}
+
+class ButtonsPageLooks : public ButtonsPageTest, public ::testing::WithParamInterface<bool> {};
+
+TEST_P(ButtonsPageLooks, EveryStateLooksUnlikeTheNormalOneAndTheLabelsStandOut) {
+  Open(GetParam());
+  page->ShowPage(GalleryPageID::kButtons);
+  const ui::HeadlessPixels px = Pixels();
+  for (int k = 0; k < kButtonKindCount; ++k) {
+    const ButtonKind kind = KindAt(k);
+    const RectL normal = Cell(kind, ShownState::kNormal);
+    EXPECT_GT(LumaSpread(px, normal), 40) << "kind " << k << ": the normal sample is painted";
+    for (int s = 1; s < kShownStateCount; ++s) {
+      if (!KindShowsState(kind, StateAt(s))) continue;
+      EXPECT_GT(CountDifferences(px, normal, px, Cell(kind, StateAt(s))), 8)
+          << "kind " << k << ", state " << s << " looks like the normal state";
+    }
+    if (KindShowsState(kind, ShownState::kDisabledOn)) {
+      EXPECT_GT(CountDifferences(px, Cell(kind, ShownState::kOn), px, Cell(kind, ShownState::kDisabledOn)), 8)
+          << "kind " << k << ": disabled and on looks like on";
+    }
+    // The kind's name at the left of its row reads against the row.
+    const RectF labelRect(6, Grid()->GetCellRect(kind, ShownState::kNormal).top, 100, 14);
+    EXPECT_GT(LumaSpread(px, OnPage(Grid(), labelRect)), 90) << "kind " << k << ": its name is legible";
+  }
+  EXPECT_GT(CountDifferences(px, Cell(ButtonKind::kTriStateCheckbox, ShownState::kOn), px,
+                             Cell(ButtonKind::kTriStateCheckbox, ShownState::kMixed)),
+            8)
+      << "mixed is not on";
+  // The column headings.
+  const RectF heading = Grid()->GetCellRect(ButtonKind::kText, ShownState::kPressed);
+  EXPECT_GT(LumaSpread(px, OnPage(Grid(), RectF(heading.left, 4, heading.width, 14))), 60);
+}
+
+TEST_P(ButtonsPageLooks, APressedTextButtonIsShadedOtherwiseThanItsRollover) {
+  // Pressed and rolled over differ only by the down state: the face of the
+  // bevel turns, which a single column of the button shows.
+  Open(GetParam());
+  page->ShowPage(GalleryPageID::kButtons);
+  const ui::HeadlessPixels px = Pixels();
+  const ui::UI_Node* rollover = Grid()->GetSample(ButtonKind::kText, ShownState::kRollover);
+  const ui::UI_Node* pressed = Grid()->GetSample(ButtonKind::kText, ShownState::kPressed);
+  const RectL a = OnPage(rollover, RectF(4, 2, 4, 18)), b = OnPage(pressed, RectF(4, 2, 4, 18));
+  EXPECT_GT(CountDifferences(px, a, px, b), 20);
+}
+
+INSTANTIATE_TEST_SUITE_P(BothLooks, ButtonsPageLooks, ::testing::Values(false, true),
+                         [](const ::testing::TestParamInfo<bool>& inInfo) {
+                           return std::string(inInfo.param ? "Light" : "Dark");
+                         });
+
+TEST_F(ButtonsPageTest, TheSelectorSwitchesBetweenThePagesByClicks) {
+  Open(false);
+  ASSERT_EQ(page->GetShownPage(), GalleryPageID::kBasics);
+  EXPECT_FALSE(page->GetButtonsPage()->UI_IsShown());
+  const RectL sectionOnPage = OnPage(page->GetSection("section-drawing"), RectF(0, 0, 1, 1));
+  const ui::HeadlessPixels basics = Pixels();
+
+  Click(page->GetPageSelector()->GetChoice(GalleryPageID::kButtons));
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons);
+  EXPECT_EQ(page->GetPageSelector()->GetSelected(), GalleryPageID::kButtons);
+  EXPECT_TRUE(page->GetButtonsPage()->UI_IsShown());
+  EXPECT_FALSE(page->GetSection("section-drawing")->UI_AreAllParentsVisible());
+  const ui::HeadlessPixels buttons = Pixels();
+  const RectL body(0, sectionOnPage.top, 1120, 720 - sectionOnPage.top);
+  EXPECT_GT(CountDifferences(basics, body, buttons, body), 20000) << "the window shows the other page";
+
+  // A click where a basics control was now lands on the Buttons page.
+  Click(page->GetPageSelector()->GetChoice(GalleryPageID::kBasics));
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kBasics);
+  EXPECT_FALSE(page->GetButtonsPage()->UI_IsShown());
+  EXPECT_EQ(CountDifferences(basics, body, Pixels(), body), 0) << "the basics come back as they were";
+}
+
+TEST_F(ButtonsPageTest, HiddenPagesTakeNoClicks) {
+  Open(false);
+  // The live text button lies under the basics page; while the basics show,
+  // a click there does not reach it.
+  ui::UI_Node* render = Live()->GetButton(ButtonKind::kText);
+  const UTF16String hint = Live()->GetStatus();
+  Click(render);
+  EXPECT_EQ(Live()->GetStatus(), hint);
+  page->ShowPage(GalleryPageID::kButtons);
+  system.Pump();
+  Click(render);
+  EXPECT_EQ(Live()->GetStatus(), u"Text button pressed");
+}
+
+TEST_F(ButtonsPageTest, LiveButtonsReportWhatTheyDidOnTheStatusLine) {
+  Open(true);
+  page->ShowPage(GalleryPageID::kButtons);
+  const RectL status = OnPage(Live(), RectF(0, Live()->UI_GetLocalRectF(false).height - 20, 300, 20));
+  const ui::HeadlessPixels before = Pixels();
+
+  Click(Live()->GetButton(ButtonKind::kText));
+  EXPECT_EQ(Live()->GetStatus(), u"Text button pressed");
+  EXPECT_GT(CountDifferences(before, status, Pixels(), status), 20) << "the status line is repainted";
+
+  Click(Live()->GetButton(ButtonKind::kPicture));
+  EXPECT_EQ(Live()->GetStatus(), u"Picture button pressed");
+  Click(Live()->GetButton(ButtonKind::kOwnerDraw));
+  EXPECT_EQ(Live()->GetStatus(), u"Owner-drawn button pressed");
+
+  Click(Live()->GetButton(ButtonKind::kLock));
+  EXPECT_EQ(Live()->GetStatus(), u"Lock: locked");
+  Click(Live()->GetButton(ButtonKind::kLock));
+  EXPECT_EQ(Live()->GetStatus(), u"Lock: unlocked");
+
+  // On the box at the left end of each checkbox.
+  ui::UI_Node* box = Live()->GetButton(ButtonKind::kCheckbox);
+  ClickAt(box, 6, 9);
+  EXPECT_EQ(Live()->GetStatus(), u"Checkbox: on");
+  ClickAt(box, 6, 9);
+  EXPECT_EQ(Live()->GetStatus(), u"Checkbox: off");
+  ui::UI_Node* tri = Live()->GetButton(ButtonKind::kTriStateCheckbox);
+  for (const char16_t* expected : {u"Tri-state checkbox: on", u"Tri-state checkbox: mixed", u"Tri-state checkbox: off"}) {
+    ClickAt(tri, 6, 9);
+    EXPECT_EQ(Live()->GetStatus(), expected);
+  }
+
+  controls::UI_RadioGroup* group = Live()->GetRadioGroup();
+  ui::UI_Node* surround = (group->ChildBegin() + 2)->get();
+  ClickAt(surround, 6, 9);
+  EXPECT_EQ(group->GetIndex(), 2);
+  EXPECT_EQ(Live()->GetStatus(), u"Radio: 5.1");
+
+  // The triangle turns open at the click. (It tells its listeners when its
+  // turn has ended, on a timer of the window.)
+  controls::UI_Button* triangle = Live()->GetButton(ButtonKind::kDisclosure);
+  Click(triangle);
+  EXPECT_TRUE(triangle->GetDownState());
+}
+
+TEST_F(ButtonsPageTest, StateSamplesKeepTheirLookUnderTheMouse) {
+  Open(false);
+  page->ShowPage(GalleryPageID::kButtons);
+  const ui::HeadlessPixels before = Pixels();
+  const RectL normal = Cell(ButtonKind::kText, ShownState::kNormal);
+  const RectL check = Cell(ButtonKind::kCheckbox, ShownState::kNormal);
+  system.MovePointer(system.GetLayer().ClientToScreen(
+      window->GetHandle(), ui::OS_Point(normal.left + normal.width / 2, normal.top + normal.height / 2)));
+  Click(Grid()->GetSample(ButtonKind::kCheckbox, ShownState::kNormal));
+  const ui::HeadlessPixels after = Pixels();
+  EXPECT_EQ(CountDifferences(before, normal, after, normal), 0);
+  EXPECT_EQ(CountDifferences(before, check, after, check), 0);
+  EXPECT_FALSE(static_cast<controls::UI_Checkbox*>(Grid()->GetSample(ButtonKind::kCheckbox, ShownState::kNormal))
+                   ->IsChecked());
+}
+
+}  // namespace
+}  // namespace norvik::gallery
