@@ -12,9 +12,18 @@
 namespace norvik::controls {
 
 namespace {
-// Label colours: the theme's text colour, and its dimmed form when disabled.
+// Label colours: the theme's text colour, and the same at half strength when
+// disabled. A translucent text colour dims towards whatever lies under the
+// label, so a disabled label reads on a panel and on a disabled bevel alike,
+// in the dark and in the light look.
 constexpr std::uint64_t kLabelColor = 1;
-constexpr std::uint64_t kDisabledLabelColor = 7;
+constexpr float kDisabledLabelAlpha = 0.5f;
+
+drawbot::ColorRGBA LabelColor(const DrawParameters& inParams, bool inDisabled) {
+  drawbot::ColorRGBA color = inParams.Color(kLabelColor);
+  if (inDisabled) color.alpha *= kDisabledLabelAlpha;
+  return color;
+}
 
 const unsigned short* Chars(const UTF16String& inText) {
   return reinterpret_cast<const unsigned short*>(inText.c_str());
@@ -54,7 +63,7 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
   if (text.empty() || !supplier || !surface || inRect.width <= 0 || !supplier->SupportsFonts()) return;
   drawbot::FontP font = LabelFont(supplier, inText);
   const bool disabled = inParams.GetControlState().Test(UI_ControlView::kStateDisabled);
-  drawbot::BrushP brush(supplier, inParams.Color(disabled ? kDisabledLabelColor : kLabelColor));
+  drawbot::BrushP brush(supplier, LabelColor(inParams, disabled));
   if (!font || !brush) return;
   const float ascent = font->GetAscent(), descent = font->GetDescent();
   const float baseline = inRect.top + (inRect.height - (ascent + descent)) / 2 + ascent;
@@ -65,7 +74,7 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
   const std::int64_t mnemonic = inParams.GetMnemonicLocation();
   if (inParams.GetAllowMnemonics() && inParams.GetDisplayMnemonics() && mnemonic >= 0 &&
       static_cast<std::size_t>(mnemonic) < text.size()) {
-    drawbot::PenP pen(supplier, inParams.Color(disabled ? kDisabledLabelColor : kLabelColor), 1);
+    drawbot::PenP pen(supplier, LabelColor(inParams, disabled), 1);
     surface->DrawStringWithUnderline(*brush, *font, *pen, Chars(text), at, inText.GetTextAlignment(),
                                      inText.GetTextTruncation(), inRect.width, static_cast<long>(mnemonic),
                                      static_cast<long>(mnemonic));

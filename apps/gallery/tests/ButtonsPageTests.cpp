@@ -175,6 +175,14 @@ TEST_P(ButtonsPageLooks, EveryStateLooksUnlikeTheNormalOneAndTheLabelsStandOut) 
                              Cell(ButtonKind::kTriStateCheckbox, ShownState::kMixed)),
             8)
       << "mixed is not on";
+  // A disabled button's label is dimmed, not lost: inside the bevel (its
+  // edges left out) the label still stands out from the face.
+  for (ButtonKind kind : {ButtonKind::kText, ButtonKind::kDefaultText, ButtonKind::kDisclosure}) {
+    const ui::UI_Node* disabled = Grid()->GetSample(kind, ShownState::kDisabled);
+    const RectF r = disabled->UI_GetLocalRectF(false);
+    EXPECT_GT(LumaSpread(px, OnPage(disabled, RectF(20, 5, r.width - 26, r.height - 10))), 40)
+        << "kind " << static_cast<int>(kind) << ": the disabled label is legible";
+  }
   // The column headings.
   const RectF heading = Grid()->GetCellRect(ButtonKind::kText, ShownState::kPressed);
   EXPECT_GT(LumaSpread(px, OnPage(Grid(), RectF(heading.left, 4, heading.width, 14))), 60);
