@@ -37,7 +37,7 @@ int ButtonGridView::GetSampleCount() const {
 
 float ButtonGridView::RowHeight() const {
   const RectF r = UI_GetLocalRectF(false);
-  return std::floor(std::clamp((r.height - kHeadingHeight) / kButtonKindCount, 22.0f, 34.0f));
+  return std::floor(std::clamp((r.height - kHeadingHeight) / kButtonKindCount, kMinRowHeight, kMaxRowHeight));
 }
 
 float ButtonGridView::ColumnWidth() const {

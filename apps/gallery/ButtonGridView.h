@@ -18,12 +18,16 @@ class ButtonGridView : public ui::UI_SubView {
   // The cell of a kind and state, local to the grid.
   RectF GetCellRect(ButtonKind inKind, ShownState inState) const;
   int GetSampleCount() const;
+  // The height at which the rows stand at their most generous spacing.
+  static float GetPreferredHeight() { return kHeadingHeight + kButtonKindCount * kMaxRowHeight; }
 
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
   void UI_SizeChanged(const RectF& inLocalRect) override;
 
   static constexpr float kLabelWidth = 150;
   static constexpr float kHeadingHeight = 22;
+  static constexpr float kMinRowHeight = 22;
+  static constexpr float kMaxRowHeight = 34;
 
  private:
   void Arrange();

@@ -31,7 +31,9 @@ void ButtonsView::Arrange() {
   const float liveH =
       std::min(std::ceil(mLive->GetHeightForWidth(std::max(0.0f, r.width - 2 * SectionView::kPadding)) + chrome),
                std::max(0.0f, r.height / 2));
-  const float gridH = std::max(0.0f, r.height - liveH - gap);
+  // The grid takes what it can use; below the live buttons the page's
+  // background shows.
+  const float gridH = std::min(std::max(0.0f, r.height - liveH - gap), ButtonGridView::GetPreferredHeight() + chrome);
   mGridSection->UI_SetLocalRectF(RectF(0, 0, r.width, gridH));
   mGrid->UI_SetLocalRectF(mGridSection->ContentRect());
   mLiveSection->UI_SetLocalRectF(RectF(0, gridH + gap, r.width, liveH));

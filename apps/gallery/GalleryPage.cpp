@@ -29,7 +29,7 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   AddGalleryChild(this, mBasics);
   mButtons.reset(new ButtonsView());
   AddGalleryChild(this, mButtons);
-  mButtons->UI_Show(false);
+  ShowPage(GalleryPageID::kBasics);
 }
 
 void GalleryPage::ShowPage(GalleryPageID inPage) {
@@ -37,6 +37,10 @@ void GalleryPage::ShowPage(GalleryPageID inPage) {
   GetPageSelector()->Select(inPage);
   mBasics->UI_Show(inPage == GalleryPageID::kBasics);
   mButtons->UI_Show(inPage == GalleryPageID::kButtons);
+  mHeader->SetSubtitle(
+      inPage == GalleryPageID::kButtons
+          ? Text("$$$/norvik/gallery/Subtitle/Buttons=Every kind of button in every state, and working ones to try")
+          : Text("$$$/norvik/gallery/Subtitle=Nodes, drawing, theme colours, hover and keyboard focus"));
   UI_Invalidate(nullptr, 0);
 }
 

@@ -50,7 +50,7 @@ class GalleryPage : public ui::UI_SubView {
   void Arrange();
   ui::KeyframeThemeEditorP mTheme;
   bool mLight;
-  ui::UI_NodeP mHeader;
+  boost::intrusive_ptr<HeaderView> mHeader;
   boost::intrusive_ptr<BrightnessSwitch> mSwitch;
   ui::UI_NodeP mSelector;
   ui::UI_NodeP mBasics;

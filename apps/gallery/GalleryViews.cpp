@@ -294,6 +294,12 @@ void FocusDemoView::UI_Draw(drawbot::Drawbot* inDrawbot) {
 
 HeaderView::HeaderView() { UI_SetNodeID("header"); }
 
+void HeaderView::SetSubtitle(const UTF16String& inSubtitle) {
+  if (mSubtitle == inSubtitle) return;
+  mSubtitle = inSubtitle;
+  UI_Invalidate(nullptr, 0);
+}
+
 void HeaderView::UI_Draw(drawbot::Drawbot* inDrawbot) {
   const GalleryColors c = CurrentColors();
   const RectF r = UI_GetLocalRectF(false);
@@ -306,8 +312,7 @@ void HeaderView::UI_Draw(drawbot::Drawbot* inDrawbot) {
   if (bold)
     titleW = inDrawbot->GetSurface()->MeasureStringWidth(*bold, U16(title), static_cast<long>(title.size()));
   DrawLabel(inDrawbot, title, RectF(42, 0, titleW + 4, r.height), c.text, drawbot::kTextAlignLeft, 15, true);
-  DrawLabel(inDrawbot,
-            Text("$$$/norvik/gallery/Subtitle=Nodes, drawing, theme colours, hover and keyboard focus"),
+  DrawLabel(inDrawbot, mSubtitle,
             RectF(42 + titleW + 16, 0, std::max(0.0f, r.width - titleW - 58 - 180), r.height), c.dimText);
   UI_SubView::UI_Draw(inDrawbot);
 }

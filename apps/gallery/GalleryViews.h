@@ -102,11 +102,17 @@ class FocusDemoView : public ui::UI_SubView {
   void Arrange();
 };
 
-// The page's title bar: the program's name and what it shows.
+// The page's title bar: the program's name and what the page on show holds.
 class HeaderView : public ui::UI_SubView {
  public:
   HeaderView();
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+  // What the page on show is about, beside the title.
+  void SetSubtitle(const UTF16String& inSubtitle);
+  const UTF16String& GetSubtitle() const { return mSubtitle; }
+
+ private:
+  UTF16String mSubtitle;
 };
 
 // A two-state switch between the dark and the light look. A click flips

@@ -171,11 +171,11 @@ TEST_F(DefaultKeyframes, LowBrightnessIsTheDarkLookAndHighBrightnessTheLight) {
   theme->SetBrightness(0);
   EXPECT_LT(theme->GetColor(2).red, 0.2f);    // panel fill
   EXPECT_GT(theme->GetColor(1).red, 0.7f);    // text
-  EXPECT_EQ(theme->GetIconType(), 1);
+  EXPECT_EQ(theme->GetIconType(), 0) << "light glyphs on the dark panels";
   theme->SetBrightness(1);
   EXPECT_TRUE(ColorNear(theme->GetColor(2), Grey(1)));
   EXPECT_TRUE(ColorNear(theme->GetColor(1), Grey(0x26 / 255.0f)));
-  EXPECT_EQ(theme->GetIconType(), 0);
+  EXPECT_EQ(theme->GetIconType(), 1) << "the dark \"_D\" glyphs on the light panels";
 }
 
 TEST_F(DefaultKeyframes, TheDefaultBrightnessIsDarkerThanHalfway) {
