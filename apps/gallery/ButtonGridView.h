@@ -33,7 +33,7 @@ class ButtonGridView : public ui::UI_SubView {
   void Arrange();
   float RowHeight() const;
   float ColumnWidth() const;
-  std::vector<std::vector<controls::UI_ButtonP>> mSamples;  // [kind][state]
+  std::vector<std::vector<controls::UI_ControlViewP>> mSamples;  // [kind][state]
   ui::UI_NodeP mRadioGroup;                                  // holds the radio row
 };
 

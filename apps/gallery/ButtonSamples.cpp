@@ -1,5 +1,6 @@
 #include "ButtonSamples.h"
 
+#include "controls/UI_ButtonBar.h"
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_DisclosureTriangleButton.h"
 #include "controls/UI_LockButton.h"
@@ -81,7 +82,7 @@ void SupplyAddImage(controls::UI_PictureSupplyMessage* ioMessage) {
   ioMessage->SetImage(manager->GetImage(manager->GetOSDrawSupplier(), name, drawbot::kImageFileTypePNG));
 }
 
-controls::UI_Button* NewButton(ButtonKind inKind, bool inSample) {
+controls::UI_ControlView* NewButton(ButtonKind inKind, bool inSample) {
   using namespace controls;
   switch (inKind) {
     case ButtonKind::kText:
@@ -117,6 +118,13 @@ controls::UI_Button* NewButton(ButtonKind inKind, bool inSample) {
       return box;
     }
     case ButtonKind::kRadio: return New<UI_RadioButton>(inSample, Text("$$$/norvik/gallery/Buttons/Stereo=Stereo"));
+    case ButtonKind::kButtonBar: {
+      auto* bar = New<UI_ButtonBar>(inSample);
+      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/Video=Video"), 0);
+      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/Audio=Audio"), 1);
+      bar->SetValue(0);
+      return bar;
+    }
   }
   return nullptr;
 }
@@ -136,6 +144,7 @@ UTF16String ButtonKindName(ButtonKind inKind) {
       "$$$/norvik/gallery/Buttons/Kind/Checkbox=Checkbox",
       "$$$/norvik/gallery/Buttons/Kind/TriState=Tri-state checkbox",
       "$$$/norvik/gallery/Buttons/Kind/Radio=Radio buttons",
+      "$$$/norvik/gallery/Buttons/Kind/ButtonBar=Button bar",
   };
   return Text(keys[static_cast<int>(inKind)]);
 }
@@ -154,6 +163,9 @@ bool KindShowsState(ButtonKind inKind, ShownState inState) {
   const bool keepsValue = inKind == ButtonKind::kLock || inKind == ButtonKind::kLink ||
                           inKind == ButtonKind::kDisclosure || inKind == ButtonKind::kCheckbox ||
                           inKind == ButtonKind::kTriStateCheckbox || inKind == ButtonKind::kRadio;
+  if (inKind == ButtonKind::kButtonBar)
+    return inState == ShownState::kNormal || inState == ShownState::kPressed || inState == ShownState::kFocused ||
+           inState == ShownState::kDisabled;
   switch (inState) {
     case ShownState::kOn:
     case ShownState::kDisabledOn: return keepsValue;
@@ -172,27 +184,36 @@ PointF ButtonSize(ButtonKind inKind) {
     case ButtonKind::kTriStateCheckbox:
     case ButtonKind::kRadio: return PointF(96, 18);
     case ButtonKind::kDisclosure: return PointF(90, 20);
+    case ButtonKind::kButtonBar: return PointF(104, 20);
     default: return PointF(90, 22);
   }
 }
 
-controls::UI_ButtonP MakeLiveButton(ButtonKind inKind) { return controls::UI_ButtonP(NewButton(inKind, false)); }
+controls::UI_ControlViewP MakeLiveButton(ButtonKind inKind) {
+  return controls::UI_ControlViewP(NewButton(inKind, false));
+}
 
-controls::UI_ButtonP MakeStateSample(ButtonKind inKind, ShownState inState) {
-  controls::UI_ButtonP button(NewButton(inKind, true));
+controls::UI_ControlViewP MakeStateSample(ButtonKind inKind, ShownState inState) {
+  controls::UI_ControlViewP control(NewButton(inKind, true));
   const bool on = inState == ShownState::kOn || inState == ShownState::kDisabledOn;
-  if (auto* box = dynamic_cast<controls::UI_Checkbox*>(button.get()))
+  const bool pressed = inState == ShownState::kPressed;
+  if (auto* box = dynamic_cast<controls::UI_Checkbox*>(control.get())) {
     box->SetValue(inState == ShownState::kMixed ? controls::UI_Checkbox::kMixed
                                                 : (on ? controls::UI_Checkbox::kOn : controls::UI_Checkbox::kOff));
-  else
+  } else if (auto* button = dynamic_cast<controls::UI_Button*>(control.get())) {
     button->SetValue(on ? controls::UI_Button::kButtonOn : controls::UI_Button::kButtonOff);
+  }
   // Pressed is the look under the mouse while the button is held: down and
-  // rolled over.
-  if (inState == ShownState::kPressed) button->SetDownState(true);
-  dynamic_cast<SampleLook&>(*button).Force(inState == ShownState::kRollover || inState == ShownState::kPressed,
-                                           inState == ShownState::kFocused);
-  button->SetEnabled(inState != ShownState::kDisabled && inState != ShownState::kDisabledOn);
-  return button;
+  // rolled over. In a bar, the segment that is not selected is the one held.
+  if (auto* bar = dynamic_cast<controls::UI_ButtonBar*>(control.get())) {
+    if (pressed && bar->GetButton(1)) bar->GetButton(1)->SetDownState(true);
+  } else if (pressed) {
+    control->SetDownState(true);
+  }
+  dynamic_cast<SampleLook&>(*control).Force(inState == ShownState::kRollover || pressed,
+                                            inState == ShownState::kFocused);
+  control->SetEnabled(inState != ShownState::kDisabled && inState != ShownState::kDisabledOn);
+  return control;
 }
 
 }  // namespace norvik::gallery

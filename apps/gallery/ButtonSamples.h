@@ -7,7 +7,7 @@
 // to one node at a time, are answered by the sample itself. A sample takes
 // no mouse events and no focus, so nothing a user does changes it.
 #include "GalleryStyle.h"
-#include "controls/UI_Button.h"
+#include "controls/UI_ControlView.h"
 
 namespace norvik::gallery {
 
@@ -23,8 +23,9 @@ enum class ButtonKind {
   kCheckbox,
   kTriStateCheckbox,
   kRadio,
+  kButtonBar,
 };
-constexpr int kButtonKindCount = 11;
+constexpr int kButtonKindCount = 12;
 
 enum class ShownState { kNormal, kRollover, kPressed, kOn, kMixed, kFocused, kDisabled, kDisabledOn };
 constexpr int kShownStateCount = 8;
@@ -35,14 +36,16 @@ inline ShownState StateAt(int inIndex) { return static_cast<ShownState>(inIndex)
 UTF16String ButtonKindName(ButtonKind inKind);
 UTF16String ShownStateName(ShownState inState);
 // Whether a button of inKind has inState: "on" only for buttons that keep a
-// value, "mixed" only for the tri-state checkbox.
+// value, "mixed" only for the tri-state checkbox. A button bar always shows
+// its selection, and its buttons light up one by one under the mouse: it
+// has no rollover, on or mixed state of its own.
 bool KindShowsState(ButtonKind inKind, ShownState inState);
 // The size a button of inKind takes in the page.
 PointF ButtonSize(ButtonKind inKind);
 
 // A working button of inKind, with its label, picture and settings.
-controls::UI_ButtonP MakeLiveButton(ButtonKind inKind);
+controls::UI_ControlViewP MakeLiveButton(ButtonKind inKind);
 // A button of inKind frozen in inState.
-controls::UI_ButtonP MakeStateSample(ButtonKind inKind, ShownState inState);
+controls::UI_ControlViewP MakeStateSample(ButtonKind inKind, ShownState inState);
 
 }  // namespace norvik::gallery

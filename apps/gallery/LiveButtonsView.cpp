@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "GalleryViews.h"
+#include "controls/UI_ButtonBar.h"
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_DisclosureTriangleButton.h"
 #include "controls/UI_RadioGroup.h"
@@ -46,12 +47,12 @@ LiveButtonsView::LiveButtonsView() {
   for (int k = 0; k < kButtonKindCount; ++k) {
     const ButtonKind kind = KindAt(k);
     if (kind == ButtonKind::kRadio) {
-      mButtons.emplace_back(static_cast<controls::UI_Button*>(mRadios.front().get()));
+      mButtons.emplace_back(static_cast<controls::UI_ControlView*>(mRadios.front().get()));
       mItems.push_back(mRadioGroup);
       Listen(*group, kind);
       continue;
     }
-    controls::UI_ButtonP button = MakeLiveButton(kind);
+    controls::UI_ControlViewP button = MakeLiveButton(kind);
     button->SetWantsKeyboardFocus(true);
     mButtons.push_back(button);
     mItems.push_back(button);
@@ -67,8 +68,9 @@ void LiveButtonsView::Listen(controls::UI_ControlView& inControl, ButtonKind inK
 }
 
 UTF16String LiveButtonsView::Describe(ButtonKind inKind) const {
-  const controls::UI_Button& button = *mButtons[static_cast<int>(inKind)];
-  const bool on = button.GetValue() == controls::UI_Button::kButtonOn;
+  const controls::UI_ControlView& control = *mButtons[static_cast<int>(inKind)];
+  const auto* button = dynamic_cast<const controls::UI_Button*>(&control);
+  const bool on = button && button->GetValue() == controls::UI_Button::kButtonOn;
   switch (inKind) {
     case ButtonKind::kText: return Text("$$$/norvik/gallery/Buttons/Live/Text=Text button pressed");
     case ButtonKind::kDefaultText: return Text("$$$/norvik/gallery/Buttons/Live/Default=Default button pressed");
@@ -87,9 +89,9 @@ UTF16String LiveButtonsView::Describe(ButtonKind inKind) const {
                 : Text("$$$/norvik/gallery/Buttons/Live/Closed=Disclosure triangle: closed");
     case ButtonKind::kCheckbox:
       return Fill("$$$/norvik/gallery/Buttons/Live/Checkbox=Checkbox: ^0",
-                  OnOff(static_cast<const controls::UI_Checkbox&>(button).IsChecked()));
+                  OnOff(static_cast<const controls::UI_Checkbox&>(control).IsChecked()));
     case ButtonKind::kTriStateCheckbox: {
-      const auto value = static_cast<const controls::UI_Checkbox&>(button).GetValue();
+      const auto value = static_cast<const controls::UI_Checkbox&>(control).GetValue();
       return Fill("$$$/norvik/gallery/Buttons/Live/TriState=Tri-state checkbox: ^0",
                   value == controls::UI_Checkbox::kMixed ? Text("$$$/norvik/gallery/Buttons/Live/Mixed=mixed")
                                                          : OnOff(value == controls::UI_Checkbox::kOn));
@@ -97,6 +99,12 @@ UTF16String LiveButtonsView::Describe(ButtonKind inKind) const {
     case ButtonKind::kRadio: {
       const controls::UI_RadioButton* selected = GetRadioGroup()->GetSelectedRadioButton();
       return Fill("$$$/norvik/gallery/Buttons/Live/Radio=Radio: ^0", selected ? selected->GetText() : UTF16String());
+    }
+    case ButtonKind::kButtonBar: {
+      const auto& bar = static_cast<const controls::UI_ButtonBar&>(control);
+      const auto* selected = dynamic_cast<const controls::UI_TextButton*>(bar.GetButton(bar.GetSelectedIndex()));
+      return Fill("$$$/norvik/gallery/Buttons/Live/ButtonBar=Button bar: ^0",
+                  selected ? selected->GetText() : UTF16String());
     }
   }
   return UTF16String();
@@ -108,7 +116,7 @@ void LiveButtonsView::SetStatus(const UTF16String& inStatus) {
   UI_Invalidate(nullptr, 0);
 }
 
-controls::UI_Button* LiveButtonsView::GetButton(ButtonKind inKind) const {
+controls::UI_ControlView* LiveButtonsView::GetButton(ButtonKind inKind) const {
   return mButtons[static_cast<int>(inKind)].get();
 }
 

@@ -18,7 +18,7 @@ class LiveButtonsView : public ui::UI_SubView {
   LiveButtonsView();
 
   // The live button of inKind; for radio buttons, the first of the group.
-  controls::UI_Button* GetButton(ButtonKind inKind) const;
+  controls::UI_ControlView* GetButton(ButtonKind inKind) const;
   controls::UI_RadioGroup* GetRadioGroup() const;
   const UTF16String& GetStatus() const { return mStatus; }
   // The height the buttons and the status line need at inWidth.
@@ -39,7 +39,7 @@ class LiveButtonsView : public ui::UI_SubView {
   void Listen(controls::UI_ControlView& inControl, ButtonKind inKind);
   UTF16String Describe(ButtonKind inKind) const;
 
-  std::vector<controls::UI_ButtonP> mButtons;  // by kind; the radio entry is the first radio
+  std::vector<controls::UI_ControlViewP> mButtons;  // by kind; the radio entry is the first radio
   std::vector<ui::UI_NodeP> mItems;           // what is laid out: the buttons and the radio group
   ui::UI_NodeP mRadioGroup;
   std::vector<ui::UI_NodeP> mRadios;

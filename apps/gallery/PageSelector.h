@@ -1,12 +1,17 @@
 #pragma once
-// The row at the top of the gallery that picks the page on show: one choice
-// per page, made of the toolkit's own controls. A user's choice calls the
-// change function; Select sets the choice without calling it.
+// The row at the top of the gallery that picks the page on show: a button
+// bar with a button per page. A user's choice (a click, or the arrow keys
+// once the bar has the focus) calls the change function; Select sets the
+// choice without calling it.
 #include <functional>
 
 #include "GalleryOptions.h"
 #include "GalleryStyle.h"
 #include "ui/UI_SubView.h"
+
+namespace norvik::controls {
+class UI_ButtonBar;
+}
 
 namespace norvik::gallery {
 
@@ -18,7 +23,7 @@ class PageSelector : public ui::UI_SubView {
   void Select(GalleryPageID inPage);
   GalleryPageID GetSelected() const;
   void SetChangeFunction(ChangeFunction inF) { mChange = std::move(inF); }
-  // The control a user clicks to choose inPage.
+  // The button a user clicks to choose inPage.
   ui::UI_Node* GetChoice(GalleryPageID inPage) const;
   // The width the choices need side by side.
   float GetPreferredWidth() const;
@@ -28,8 +33,8 @@ class PageSelector : public ui::UI_SubView {
  private:
   void Arrange();
   void ChoiceMade();
-  ui::UI_NodeP mGroup;
-  ui::UI_NodeP mChoices[2];
+  controls::UI_ButtonBar* Bar() const;
+  ui::UI_NodeP mBar;
   ChangeFunction mChange;
 };
 

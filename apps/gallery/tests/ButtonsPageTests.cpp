@@ -11,6 +11,7 @@
 #include "GalleryResources.h"
 #include "GalleryWindow.h"
 #include "PageSelector.h"
+#include "controls/UI_ButtonBar.h"
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_RadioGroup.h"
 #include "ui/HeadlessWindowSystem.h"
@@ -228,6 +229,23 @@ TEST_F(ButtonsPageTest, TheSelectorSwitchesBetweenThePagesByClicks) {
   EXPECT_EQ(CountDifferences(basics, body, Pixels(), body), 0) << "the basics come back as they were";
 }
 
+TEST_F(ButtonsPageTest, TheArrowKeysSwitchPagesOnceTheSelectorHasTheFocus) {
+  Open(true);
+  constexpr int kVirtualKeyTab = 0x09, kVirtualKeyLeft = 0x25, kVirtualKeyRight = 0x27;
+  system.TypeKey(kVirtualKeyTab);
+  system.Pump();
+  ASSERT_TRUE(page->GetPageSelector()->UI_HasKeyboardFocus(false));
+  system.TypeKey(kVirtualKeyRight);
+  system.Pump();
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons);
+  system.TypeKey(kVirtualKeyRight);
+  system.Pump();
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons) << "the row ends without wrapping";
+  system.TypeKey(kVirtualKeyLeft);
+  system.Pump();
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kBasics);
+}
+
 TEST_F(ButtonsPageTest, HiddenPagesTakeNoClicks) {
   Open(false);
   // The live text button lies under the basics page; while the basics show,
@@ -274,6 +292,11 @@ TEST_F(ButtonsPageTest, LiveButtonsReportWhatTheyDidOnTheStatusLine) {
     EXPECT_EQ(Live()->GetStatus(), expected);
   }
 
+  auto* bar = static_cast<controls::UI_ButtonBar*>(Live()->GetButton(ButtonKind::kButtonBar));
+  Click(bar->GetButton(1));
+  EXPECT_EQ(bar->GetValue(), 1);
+  EXPECT_EQ(Live()->GetStatus(), u"Button bar: Audio");
+
   controls::UI_RadioGroup* group = Live()->GetRadioGroup();
   ui::UI_Node* surround = (group->ChildBegin() + 2)->get();
   ClickAt(surround, 6, 9);
@@ -282,7 +305,7 @@ TEST_F(ButtonsPageTest, LiveButtonsReportWhatTheyDidOnTheStatusLine) {
 
   // The triangle turns open at the click. (It tells its listeners when its
   // turn has ended, on a timer of the window.)
-  controls::UI_Button* triangle = Live()->GetButton(ButtonKind::kDisclosure);
+  controls::UI_ControlView* triangle = Live()->GetButton(ButtonKind::kDisclosure);
   Click(triangle);
   EXPECT_TRUE(triangle->GetDownState());
 }

@@ -12,6 +12,7 @@
 #include "controls/UI_RadioGroup.h"
 #include "controls/UI_TextButton.h"
 #include "GalleryWindow.h"
+#include "PageSelector.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_Event.h"
 #include "ui/OS_NodeManager.h"
@@ -154,6 +155,10 @@ TEST_F(GalleryWindowTest, TabWalksTheFocusTilesForwardAndShiftTabWalksBack) {
   Open(false);
   std::vector<ui::UI_Node*> tiles = page->GetFocusTiles();
   ASSERT_EQ(tiles.size(), static_cast<std::size_t>(FocusDemoView::kTileCount));
+  // The page selector at the top is the first stop.
+  system.TypeKey(kVirtualKeyTab);
+  system.Pump();
+  EXPECT_TRUE(page->GetPageSelector()->UI_HasKeyboardFocus(false));
   system.TypeKey(kVirtualKeyTab);
   system.Pump();
   EXPECT_TRUE(tiles[0]->UI_HasKeyboardFocus(true));
