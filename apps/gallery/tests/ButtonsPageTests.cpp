@@ -2,7 +2,6 @@
 // it has, each state visibly unlike the normal one in both looks; the page
 // selector switched by clicks; the live buttons reporting on the status line.
 #include <filesystem>
-#include <memory>
 
 #include <gtest/gtest.h>
 
@@ -54,10 +53,6 @@ int LumaSpread(const ui::HeadlessPixels& inPixels, const RectL& inRect) {
   return hi - lo;
 }
 
-RectL OnPage(const ui::UI_Node* inNode, const RectF& inLocal) {
-  return inNode->UI_LocalToGlobal(RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
-                                        static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));
-}
 
 class ButtonsPageTest : public ::testing::Test {
  protected:
@@ -67,7 +62,7 @@ class ButtonsPageTest : public ::testing::Test {
     ui::Theme::Initialize(theme);
     system.Install();
     page.reset(new GalleryPage(theme, inLight));
-    window = std::make_unique<GalleryWindow>(system.GetLayer(), page, inWidth, inHeight);
+    window.reset(new GalleryWindow(page, inWidth, inHeight));
     system.Pump();
   }
   void TearDown() override {
@@ -87,18 +82,27 @@ class ButtonsPageTest : public ::testing::Test {
     return system.ReadWindowPixels(window->GetHandle());
   }
   void ClickAt(const ui::UI_Node* inNode, long inX, long inY) {
-    const RectL onPage = inNode->UI_LocalToGlobal(RectL(inX, inY, 1, 1));
+    const RectL onScreen = inNode->UI_LocalToGlobal(RectL(inX, inY, 1, 1));
     system.AdvanceClock(1000);  // past the double-click time: each click is a single one
-    system.Click(system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(onPage.left, onPage.top)));
+    system.Click(ui::OS_Point(onScreen.left, onScreen.top));
     system.Pump();
   }
   void Click(const ui::UI_Node* inNode) {
     const RectF r = inNode->UI_GetLocalRectF(false);
     ClickAt(inNode, static_cast<long>(r.width / 2), static_cast<long>(r.height / 2));
   }
+  // A rectangle of a node in the window's client coordinates: nodes in a
+  // window have the screen for their global coordinates.
+  RectL OnPage(const ui::UI_Node* inNode, const RectF& inLocal) {
+    const RectL onScreen =
+        inNode->UI_LocalToGlobal(RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
+                                       static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));
+    const ui::OS_Point origin = system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(0, 0));
+    return RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
+  }
   ButtonGridView* Grid() const { return page->GetButtonsPage()->GetGrid(); }
   LiveButtonsView* Live() const { return page->GetButtonsPage()->GetLiveButtons(); }
-  RectL Cell(ButtonKind inKind, ShownState inState) const {
+  RectL Cell(ButtonKind inKind, ShownState inState) {
     return OnPage(Grid(), Grid()->GetCellRect(inKind, inState));
   }
 
@@ -106,7 +110,7 @@ class ButtonsPageTest : public ::testing::Test {
   ui::HeadlessWindowSystem system;
   ui::KeyframeThemeEditorP theme;
   GalleryPageP page;
-  std::unique_ptr<GalleryWindow> window;
+  GalleryWindowP window;
 };
 
 TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {
@@ -303,11 +307,14 @@ TEST_F(ButtonsPageTest, LiveButtonsReportWhatTheyDidOnTheStatusLine) {
   EXPECT_EQ(group->GetIndex(), 2);
   EXPECT_EQ(Live()->GetStatus(), u"Radio: 5.1");
 
-  // The triangle turns open at the click. (It tells its listeners when its
-  // turn has ended, on a timer of the window.)
+  // The triangle turns open at the click, and tells its listeners once its
+  // turn has ended, on a timer of the window.
   controls::UI_ControlView* triangle = Live()->GetButton(ButtonKind::kDisclosure);
   Click(triangle);
   EXPECT_TRUE(triangle->GetDownState());
+  EXPECT_EQ(Live()->GetStatus(), u"Radio: 5.1") << "not before the turn has ended";
+  system.AdvanceClock(500);
+  EXPECT_EQ(Live()->GetStatus(), u"Disclosure triangle: open");
 }
 
 TEST_F(ButtonsPageTest, StateSamplesKeepTheirLookUnderTheMouse) {

@@ -240,8 +240,8 @@ TEST_F(GalleryWindowTest, ResizingTheWindowLaysTheSectionsOutInTheNewSize) {
   EXPECT_EQ(px.width, 1300);
   const SectionView* focus = page->GetSection("section-focus");
   const RectF local = focus->UI_GetLocalRectF(false);
-  const ui::UI_Node::RectL onPage = focus->UI_LocalToGlobal(
-      ui::UI_Node::RectL(0, 0, static_cast<long>(local.width), static_cast<long>(local.height)));
+  const ui::UI_Node::RectL onPage =
+      InWindow(focus, ui::UI_Node::RectL(0, 0, static_cast<long>(local.width), static_cast<long>(local.height)));
   const RectF fr(static_cast<float>(onPage.left), static_cast<float>(onPage.top), static_cast<float>(onPage.width),
                  static_cast<float>(onPage.height));
   EXPECT_NE(px.At(static_cast<int>(fr.left + fr.width - 3), static_cast<int>(fr.top + fr.height - 3)),

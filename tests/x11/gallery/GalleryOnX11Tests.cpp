@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "ControlsView.h"
+#include "PageSelector.h"
 #include "GalleryPage.h"
 #include "GalleryWindow.h"
 #include "controls/ControlMessages.h"
@@ -173,6 +174,10 @@ TEST_F(GalleryOnX11, TabTypedOnTheKeyboardWalksTheFocusTilesAndShiftTabWalksBack
   const std::vector<ui::UI_Node*> tiles = mPage->GetFocusTiles();
   ASSERT_GE(tiles.size(), 2u);
   ASSERT_EQ(mLayer->GetActiveWindow(), mWindow->GetHandle()) << "the shown main window is active";
+  // The page selector at the top of the window is the first stop.
+  Key(kKeysymTab, true);
+  Key(kKeysymTab, false);
+  ASSERT_TRUE(WaitFor([&] { return mPage->GetPageSelector()->UI_HasKeyboardFocus(false); }));
   Key(kKeysymTab, true);
   Key(kKeysymTab, false);
   ASSERT_TRUE(WaitFor([&] { return tiles[0]->UI_HasKeyboardFocus(true); })) << "Tab gave the first tile the focus";
