@@ -27,7 +27,10 @@ class UI_RadioGroup : public UI_InteractiveControlView {
   // The index of the radio child that is on, or -1.
   int GetIndex() const;
   UI_RadioButton* GetSelectedRadioButton() const;
-  void SetDrawBorder(bool inDraw) { mDrawBorder = inDraw; }
+  // A one-pixel outline in the buttons' outline colour around the group.
+  void SetDrawBorder(bool inDraw);
+  bool GetDrawBorder() const { return mDrawBorder; }
+  void UI_Draw(drawbot::Drawbot* inDrawbot) override;
 
  private:
   void AssociateRadioButton(UI_RadioButton* inButton);

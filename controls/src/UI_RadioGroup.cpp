@@ -53,6 +53,29 @@ void UI_RadioGroup::SetIndex(int inIndex) {
   if (inIndex >= 0 && static_cast<std::size_t>(inIndex) < mButtons.size()) SetValueKnown();
 }
 
+void UI_RadioGroup::SetDrawBorder(bool inDraw) {
+  if (mDrawBorder == inDraw) return;
+  mDrawBorder = inDraw;
+  UI_Invalidate(nullptr, 0);
+}
+
+// The border is the bevel's one-pixel outline alone: no fill, no rings, no
+// outer gradient. The buttons then paint over the inside.
+void UI_RadioGroup::UI_Draw(drawbot::Drawbot* inDrawbot) {
+  if (!inDrawbot) return;
+  if (mDrawBorder) {
+    DrawButtonParameters params(this);
+    DrawParameters::StateFlags state = params.GetControlState();
+    state.Clear(kStateDown | kStateRollover | kStateFocused);
+    params.SetControlState(state);
+    params.SetDrawOuterBevelOutline(false);
+    params.SetDrawInnerGradient(false);
+    params.SetDrawInnerBevelOutline(false);
+    UI_Button::Draw(params, *inDrawbot);
+  }
+  UI_InteractiveControlView::UI_Draw(inDrawbot);
+}
+
 int UI_RadioGroup::GetIndex() const { return IndexOf(GetSelectedRadioButton()); }
 
 UI_RadioButton* UI_RadioGroup::GetSelectedRadioButton() const {

@@ -5,6 +5,8 @@
 #include <gtest/gtest.h>
 
 #include "controls/UI_RadioGroup.h"
+#include "drawbot/Drawbot.h"
+#include "support/drawbot/PixelCompare.h"
 #include "support/controls/ControlTestSupport.h"
 
 namespace norvik::controls::test {
@@ -105,6 +107,24 @@ TEST_F(RadioGroupTest, ClickingButtonsThatDoNotTakeFocusLeavesFocusAlone) {
   EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
   EXPECT_FALSE(radios[2]->UI_HasKeyboardFocus(false));
   EXPECT_FALSE(group->UI_GainKeyboardFocus(ui::kFocusChangeMouse)) << "the group itself does not take focus either";
+}
+
+TEST_F(RadioGroupTest, TheBorderIsAThinOutlineAroundTheGroupAndNothingInside) {
+  auto paint = [this] {
+    drawbot::testing::PixelCanvas canvas(200, 100);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    group->UI_Draw(&drawbot);
+    return canvas.Snapshot();
+  };
+  // Column 150 and row 80 lie right of and below the buttons.
+  EXPECT_EQ(drawbot::testing::ColumnCoverage(paint(), 150), std::string(100, '.'));
+  group->SetDrawBorder(true);
+  const auto bordered = paint();
+  // The outline lies where every button's outline lies: inside the free top
+  // row and the half-stroke inset.
+  EXPECT_EQ(drawbot::testing::ColumnCoverage(bordered, 150), "..#" + std::string(94, '.') + "#..");
+  EXPECT_EQ(drawbot::testing::RowCoverage(bordered, 80), ".#" + std::string(195, '.') + "#..");
+  EXPECT_EQ(drawbot::testing::RowCoverage(bordered, 15).substr(10, 5), "#####") << "the buttons still paint";
 }
 
 // The group stands between two views that take focus, so that Tab has
