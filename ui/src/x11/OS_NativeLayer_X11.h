@@ -278,6 +278,10 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   // keyboard (X11Keyboard.cpp)
   void SetUpKeyboard();
   void LoadKeymap();
+  // The layout in force (the effective XKB group).
+  xkb_layout_index_t ActiveLayoutIndex() const;
+  // A new keymap, or the state (modifiers, the locked layout) changed.
+  void TranslateXkbEvent(const xcb_generic_event_t* inEvent);
   void TranslateKey(const xcb_key_press_event_t* inEvent, bool inPress);
   void QueueCharacters(OS_WindowHandle inTarget, const std::u32string& inText, bool inSystem, std::intptr_t inLParam);
   // paint (X11Paint.cpp)

@@ -293,7 +293,7 @@ void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
       LoadKeymap();
       break;
     default:
-      if (mXkbEventBase != 0 && type == mXkbEventBase) LoadKeymap();
+      if (mXkbEventBase != 0 && type == mXkbEventBase) TranslateXkbEvent(inEvent);
       break;
   }
 }

@@ -107,7 +107,10 @@ void OS_NativeLayer_X11::SetUpKeyboard() {
   // Autorepeat as repeated presses without releases, so a held key is seen as held.
   xcb_xkb_per_client_flags(mConnection, XCB_XKB_ID_USE_CORE_KBD, XCB_XKB_PER_CLIENT_FLAG_DETECTABLE_AUTO_REPEAT,
                            XCB_XKB_PER_CLIENT_FLAG_DETECTABLE_AUTO_REPEAT, 0, 0, 0);
-  const std::uint16_t events = XCB_XKB_EVENT_TYPE_NEW_KEYBOARD_NOTIFY | XCB_XKB_EVENT_TYPE_MAP_NOTIFY;
+  // State changes too: the desktop switches layouts by locking another group,
+  // and the active layout must be known before the next key arrives.
+  const std::uint16_t events =
+      XCB_XKB_EVENT_TYPE_NEW_KEYBOARD_NOTIFY | XCB_XKB_EVENT_TYPE_MAP_NOTIFY | XCB_XKB_EVENT_TYPE_STATE_NOTIFY;
   xcb_xkb_select_events(mConnection, static_cast<xcb_xkb_device_spec_t>(mKeyboardDevice), events, 0, events, 0xFF,
                         0xFF, nullptr);
   LoadKeymap();
@@ -139,6 +142,21 @@ void OS_NativeLayer_X11::LoadKeymap() {
 
 const KeyboardLayoutInterface* OS_NativeLayer_X11::GetKeyboardLayout() const { return mLayout.get(); }
 
+void OS_NativeLayer_X11::TranslateXkbEvent(const xcb_generic_event_t* inEvent) {
+  // The second byte of every XKB event tells which one it is.
+  const std::uint8_t xkbType = inEvent->pad0;
+  if (xkbType != XCB_XKB_STATE_NOTIFY) {
+    LoadKeymap();
+    return;
+  }
+  const auto* state = reinterpret_cast<const xcb_xkb_state_notify_event_t*>(inEvent);
+  if (mXkbState && state->deviceID == mKeyboardDevice)
+    xkb_state_update_mask(mXkbState, state->baseMods, state->latchedMods, state->lockedMods,
+                          static_cast<xkb_layout_index_t>(state->baseGroup),
+                          static_cast<xkb_layout_index_t>(state->latchedGroup),
+                          static_cast<xkb_layout_index_t>(state->lockedGroup));
+}
+
 // Key messages carry the X keycode less 8 as their scan code (the kernel's key
 // number, which matches the hardware set-1 code on the main block). The key's
 // virtual key is that of its first-level symbol in the layout now in force, so
@@ -148,8 +166,7 @@ int OS_NativeLayer_X11::ScanCodeToVirtualKey(unsigned inScanCode) const {
   if (inScanCode > 0xFFFF) return 0;
   const xkb_keycode_t keycode = static_cast<xkb_keycode_t>(inScanCode) + 8;
   if (keycode < xkb_keymap_min_keycode(mKeymap) || keycode > xkb_keymap_max_keycode(mKeymap)) return 0;
-  const xkb_layout_index_t layout =
-      mXkbState ? xkb_state_serialize_layout(mXkbState, XKB_STATE_LAYOUT_EFFECTIVE) : 0;
+  const xkb_layout_index_t layout = ActiveLayoutIndex();
   const xkb_keysym_t* syms = nullptr;
   if (xkb_keymap_key_get_syms_by_level(mKeymap, keycode, layout, 0, &syms) < 1) return 0;
   const int code = KeysymToVirtualKey(syms[0]).code;
@@ -260,11 +277,15 @@ void OS_NativeLayer_X11::TranslateKey(const xcb_key_press_event_t* inEvent, bool
   }
 }
 
-// ---- layout answers ----
+xkb_layout_index_t OS_NativeLayer_X11::ActiveLayoutIndex() const {
+  return mXkbState ? xkb_state_serialize_layout(mXkbState, XKB_STATE_LAYOUT_EFFECTIVE) : 0;
+}
+
+// ---- layout answers: those of the layout in force ----
 
 unsigned X11KeyboardLayout::GetActiveLayout() const {
   if (!mLayer.mKeymap) return kKeyboardLayoutUSEnglish;
-  const char* name = xkb_keymap_layout_get_name(mLayer.mKeymap, 0);
+  const char* name = xkb_keymap_layout_get_name(mLayer.mKeymap, mLayer.ActiveLayoutIndex());
   if (!name) return kKeyboardLayoutUSEnglish;
   for (const LayoutLanguage& l : kLayouts)
     if (std::strncmp(name, l.prefix, std::strlen(l.prefix)) == 0) return l.language;
@@ -280,9 +301,10 @@ unsigned X11KeyboardLayout::GetCodePage(unsigned inLayout) const {
 unsigned short X11KeyboardLayout::KeyToCharacter(unsigned, short inKey) const {
   xkb_keymap* keymap = mLayer.mKeymap;
   if (!keymap || inKey <= 0) return 0;
+  const xkb_layout_index_t layout = mLayer.ActiveLayoutIndex();
   for (xkb_keycode_t k = xkb_keymap_min_keycode(keymap); k <= xkb_keymap_max_keycode(keymap); ++k) {
     const xkb_keysym_t* syms = nullptr;
-    if (xkb_keymap_key_get_syms_by_level(keymap, k, 0, 0, &syms) < 1) continue;
+    if (xkb_keymap_key_get_syms_by_level(keymap, k, layout, 0, &syms) < 1) continue;
     if (KeysymToVirtualKey(syms[0]).code != inKey) continue;
     const std::uint32_t c = xkb_keysym_to_utf32(syms[0]);
     if (c == 0 || c > 0xFFFF) return 0;
@@ -295,14 +317,15 @@ unsigned short X11KeyboardLayout::KeyToCharacter(unsigned, short inKey) const {
 short X11KeyboardLayout::CharacterToKey(unsigned, unsigned short inCharacter) const {
   xkb_keymap* keymap = mLayer.mKeymap;
   if (!keymap || inCharacter == 0) return 0;
+  const xkb_layout_index_t layout = mLayer.ActiveLayoutIndex();
   for (xkb_keycode_t k = xkb_keymap_min_keycode(keymap); k <= xkb_keymap_max_keycode(keymap); ++k) {
     for (xkb_level_index_t level = 0; level < 2; ++level) {
       const xkb_keysym_t* syms = nullptr;
-      if (xkb_keymap_key_get_syms_by_level(keymap, k, 0, level, &syms) < 1) continue;
+      if (xkb_keymap_key_get_syms_by_level(keymap, k, layout, level, &syms) < 1) continue;
       const std::uint32_t c = xkb_keysym_to_utf32(syms[0]);
       if (c == inCharacter || (c >= 'a' && c <= 'z' && c - 'a' + 'A' == inCharacter)) {
         const xkb_keysym_t* base = nullptr;
-        if (xkb_keymap_key_get_syms_by_level(keymap, k, 0, 0, &base) < 1) continue;
+        if (xkb_keymap_key_get_syms_by_level(keymap, k, layout, 0, &base) < 1) continue;
         const int code = KeysymToVirtualKey(base[0]).code;
         if (code != 0) return static_cast<short>(code);
       }
