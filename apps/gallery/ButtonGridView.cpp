@@ -40,14 +40,18 @@ float ButtonGridView::RowHeight() const {
   return std::floor(std::clamp((r.height - kHeadingHeight) / kButtonKindCount, kMinRowHeight, kMaxRowHeight));
 }
 
+float ButtonGridView::LabelWidth() const {
+  return std::floor(std::clamp(UI_GetLocalRectF(false).width * 0.17f, kMinLabelWidth, kMaxLabelWidth));
+}
+
 float ButtonGridView::ColumnWidth() const {
   const RectF r = UI_GetLocalRectF(false);
-  return std::floor(std::max(0.0f, (r.width - kLabelWidth) / kShownStateCount));
+  return std::floor(std::max(0.0f, (r.width - LabelWidth()) / kShownStateCount));
 }
 
 RectF ButtonGridView::GetCellRect(ButtonKind inKind, ShownState inState) const {
   const float rowH = RowHeight(), colW = ColumnWidth();
-  return RectF(kLabelWidth + colW * static_cast<float>(inState), kHeadingHeight + rowH * static_cast<float>(inKind),
+  return RectF(LabelWidth() + colW * static_cast<float>(inState), kHeadingHeight + rowH * static_cast<float>(inKind),
                colW, rowH);
 }
 
@@ -58,13 +62,14 @@ void ButtonGridView::UI_SizeChanged(const RectF& inLocalRect) {
 
 void ButtonGridView::Arrange() {
   const RectF radioRow = GetCellRect(ButtonKind::kRadio, ShownState::kNormal);
-  mRadioGroup->UI_SetLocalRectF(RectF(kLabelWidth, radioRow.top, ColumnWidth() * kShownStateCount, radioRow.height));
+  const float labelW = LabelWidth();
+  mRadioGroup->UI_SetLocalRectF(RectF(labelW, radioRow.top, ColumnWidth() * kShownStateCount, radioRow.height));
   for (int k = 0; k < kButtonKindCount; ++k) {
     const PointF size = ButtonSize(KindAt(k));
     for (int s = 0; s < kShownStateCount; ++s) {
       if (!mSamples[k][s]) continue;
       RectF cell = GetCellRect(KindAt(k), StateAt(s));
-      if (KindAt(k) == ButtonKind::kRadio) cell.left -= kLabelWidth, cell.top = 0;
+      if (KindAt(k) == ButtonKind::kRadio) cell.left -= labelW, cell.top = 0;
       const float w = std::min(size.x, std::max(0.0f, cell.width - 10));
       const float h = std::min(size.y, cell.height);
       mSamples[k][s]->UI_SetLocalRectF(
@@ -76,19 +81,19 @@ void ButtonGridView::Arrange() {
 void ButtonGridView::UI_Draw(drawbot::Drawbot* inDrawbot) {
   const GalleryColors c = CurrentColors();
   const RectF r = UI_GetLocalRectF(false);
-  const float rowH = RowHeight(), colW = ColumnWidth();
+  const float rowH = RowHeight(), colW = ColumnWidth(), labelW = LabelWidth();
   // Every other row on a faint stripe, so that a row reads across.
   for (int k = 0; k < kButtonKindCount; k += 2)
     FillRect(inDrawbot, RectF(0, kHeadingHeight + rowH * static_cast<float>(k), r.width, rowH),
              Mix(c.panel, c.text, 0.035f));
   for (int s = 0; s < kShownStateCount; ++s)
     DrawLabel(inDrawbot, ShownStateName(StateAt(s)),
-              RectF(kLabelWidth + colW * static_cast<float>(s) + 2, 0, colW - 4, kHeadingHeight), c.dimText,
+              RectF(labelW + colW * static_cast<float>(s) + 2, 0, colW - 4, kHeadingHeight), c.dimText,
               drawbot::kTextAlignCenter, 0, true);
   FillRect(inDrawbot, RectF(0, kHeadingHeight - 1, r.width, 1), Mix(c.panel, c.border, 0.6f));
   for (int k = 0; k < kButtonKindCount; ++k)
     DrawLabel(inDrawbot, ButtonKindName(KindAt(k)),
-              RectF(6, kHeadingHeight + rowH * static_cast<float>(k), kLabelWidth - 10, rowH), c.text);
+              RectF(6, kHeadingHeight + rowH * static_cast<float>(k), labelW - 10, rowH), c.text);
   UI_SubView::UI_Draw(inDrawbot);
 }
 

@@ -24,13 +24,16 @@ class ButtonGridView : public ui::UI_SubView {
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
   void UI_SizeChanged(const RectF& inLocalRect) override;
 
-  static constexpr float kLabelWidth = 150;
+  // The column of the kinds' names takes a share of the width, within these.
+  static constexpr float kMinLabelWidth = 110;
+  static constexpr float kMaxLabelWidth = 150;
   static constexpr float kHeadingHeight = 22;
   static constexpr float kMinRowHeight = 22;
   static constexpr float kMaxRowHeight = 34;
 
  private:
   void Arrange();
+  float LabelWidth() const;
   float RowHeight() const;
   float ColumnWidth() const;
   std::vector<std::vector<controls::UI_ControlViewP>> mSamples;  // [kind][state]

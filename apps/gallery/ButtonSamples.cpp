@@ -120,9 +120,10 @@ controls::UI_ControlView* NewButton(ButtonKind inKind, bool inSample) {
     case ButtonKind::kRadio: return New<UI_RadioButton>(inSample, Text("$$$/norvik/gallery/Buttons/Stereo=Stereo"));
     case ButtonKind::kButtonBar: {
       auto* bar = New<UI_ButtonBar>(inSample);
-      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/Video=Video"), 0);
-      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/Audio=Audio"), 1);
-      bar->SetValue(0);
+      // Zoom factors: short labels, so that the bar fits a cell of the table.
+      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/ZoomOne=1×"), 1);
+      bar->AddTextButton(Text("$$$/norvik/gallery/Buttons/ZoomTwo=2×"), 2);
+      bar->SetValue(1);
       return bar;
     }
   }
@@ -184,7 +185,7 @@ PointF ButtonSize(ButtonKind inKind) {
     case ButtonKind::kTriStateCheckbox:
     case ButtonKind::kRadio: return PointF(96, 18);
     case ButtonKind::kDisclosure: return PointF(90, 20);
-    case ButtonKind::kButtonBar: return PointF(104, 20);
+    case ButtonKind::kButtonBar: return PointF(66, 20);
     default: return PointF(90, 22);
   }
 }

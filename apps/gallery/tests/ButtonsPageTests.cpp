@@ -101,6 +101,31 @@ class ButtonsPageTest : public ::testing::Test {
     return RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
   }
   ButtonGridView* Grid() const { return page->GetButtonsPage()->GetGrid(); }
+  // Checks that every kind has a sample in each of its states and nothing
+  // else, each inside its own cell (a button bar's row of buttons included);
+  // answers the number of samples.
+  int ExpectSamplesInsideTheirCells() {
+    int samples = 0;
+    for (int k = 0; k < kButtonKindCount; ++k) {
+      for (int s = 0; s < kShownStateCount; ++s) {
+        ui::UI_Node* sample = Grid()->GetSample(KindAt(k), StateAt(s));
+        EXPECT_EQ(sample != nullptr, KindShowsState(KindAt(k), StateAt(s))) << "kind " << k << " state " << s;
+        if (!sample) continue;
+        ++samples;
+        const RectL cell = Cell(KindAt(k), StateAt(s));
+        RectL frame = OnPage(sample, sample->UI_GetLocalRectF(false));
+        if (const auto* bar = dynamic_cast<const controls::UI_ButtonBar*>(sample))
+          frame.width = std::max(frame.width, static_cast<long>(bar->GetButtonbarWidth()));
+        EXPECT_GT(frame.width, 10) << "kind " << k << " state " << s;
+        EXPECT_GE(frame.left, cell.left) << "kind " << k << " state " << s;
+        EXPECT_GE(frame.top, cell.top) << "kind " << k << " state " << s;
+        EXPECT_LE(frame.left + frame.width, cell.left + cell.width) << "kind " << k << " state " << s;
+        EXPECT_LE(frame.top + frame.height, cell.top + cell.height) << "kind " << k << " state " << s;
+      }
+    }
+    return samples;
+  }
+
   LiveButtonsView* Live() const { return page->GetButtonsPage()->GetLiveButtons(); }
   RectL Cell(ButtonKind inKind, ShownState inState) {
     return OnPage(Grid(), Grid()->GetCellRect(inKind, inState));
@@ -116,22 +141,7 @@ class ButtonsPageTest : public ::testing::Test {
 TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {
   Open(false);
   page->ShowPage(GalleryPageID::kButtons);
-  int samples = 0;
-  for (int k = 0; k < kButtonKindCount; ++k) {
-    for (int s = 0; s < kShownStateCount; ++s) {
-      ui::UI_Node* sample = Grid()->GetSample(KindAt(k), StateAt(s));
-      EXPECT_EQ(sample != nullptr, KindShowsState(KindAt(k), StateAt(s))) << "kind " << k << " state " << s;
-      if (!sample) continue;
-      ++samples;
-      const RectL cell = Cell(KindAt(k), StateAt(s));
-      const RectL frame = OnPage(sample, sample->UI_GetLocalRectF(false));
-      EXPECT_GT(frame.width, 10) << "kind " << k << " state " << s;
-      EXPECT_GE(frame.left, cell.left) << "kind " << k << " state " << s;
-      EXPECT_GE(frame.top, cell.top) << "kind " << k << " state " << s;
-      EXPECT_LE(frame.left + frame.width, cell.left + cell.width) << "kind " << k << " state " << s;
-      EXPECT_LE(frame.top + frame.height, cell.top + cell.height) << "kind " << k << " state " << s;
-    }
-  }
+  const int samples = ExpectSamplesInsideTheirCells();
   EXPECT_EQ(samples, Grid()->GetSampleCount());
   EXPECT_GE(samples, 60);
   // The grid and the live buttons fit the window at the program's size.
@@ -142,6 +152,12 @@ TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {
   const RectL live = OnPage(Live(), Live()->UI_GetLocalRectF(false));
   EXPECT_LE(live.top + live.height, 720);
   EXPECT_GE(live.top, grid.top + grid.height);
+}
+
+TEST_F(ButtonsPageTest, InASmallerWindowTheSamplesStillKeepToTheirCells) {
+  Open(true, 800, 560);
+  page->ShowPage(GalleryPageID::kButtons);
+  EXPECT_EQ(ExpectSamplesInsideTheirCells(), Grid()->GetSampleCount());
 }
 
 TEST_F(ButtonsPageTest, TheSelectedStateIsOnlyForButtonsThatKeepAValue) {
@@ -298,8 +314,8 @@ TEST_F(ButtonsPageTest, LiveButtonsReportWhatTheyDidOnTheStatusLine) {
 
   auto* bar = static_cast<controls::UI_ButtonBar*>(Live()->GetButton(ButtonKind::kButtonBar));
   Click(bar->GetButton(1));
-  EXPECT_EQ(bar->GetValue(), 1);
-  EXPECT_EQ(Live()->GetStatus(), u"Button bar: Audio");
+  EXPECT_EQ(bar->GetValue(), 2);
+  EXPECT_EQ(Live()->GetStatus(), u"Button bar: 2×");
 
   controls::UI_RadioGroup* group = Live()->GetRadioGroup();
   ui::UI_Node* surround = (group->ChildBegin() + 2)->get();
