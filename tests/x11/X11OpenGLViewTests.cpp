@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "support/ui/NativeWindowTestSupport.h"
+#include "ui/MouseEvent.h"
 #include "ui/OS_NodeManager.h"
 #include "ui/OS_OpenGLView.h"
 #include "ui/OS_ViewContainer.h"
@@ -35,8 +36,13 @@ class RectangleGLView : public OS_OpenGLView {
     renderer = CurrentGLRenderer();
     FillGLRectangle(10, 20, 40, 30, static_cast<int>(UI_GetLocalRect().height), 1.0f, 0.5f, 0.0f);
   }
+  bool UI_DoMouseEvent(UI_Node*, const MouseEvent& inEvent) override {
+    if (inEvent.GetAction() == MouseEvent::kActionButtonDown) presses.push_back(inEvent.GetPosition());
+    return true;
+  }
   int draws = 0;
   std::string renderer;
+  std::vector<tarsel::geom::PointT<float>> presses;
 };
 
 using RectangleGLViewP = boost::intrusive_ptr<RectangleGLView>;
@@ -151,6 +157,20 @@ TEST_F(X11OpenGLView, AViewInARealWindowClearsAndDrawsItsRectangle) {
   ASSERT_TRUE(WaitFor([&] { return view->draws > 0; })) << "the view was never painted";
   EXPECT_FALSE(view->renderer.empty());
   ExpectDrawnAt(window, 30, 20, "gl-view-drawn");
+}
+
+TEST_F(X11OpenGLView, AClickOnTheGLSurfaceReachesTheViewAtItsPlace) {
+  auto window = MakeWindow(OS_Rect(40, 40, 200, 150));
+  RectangleGLViewP view = AddGLView(window.get(), UI_Node::RectL(30, 20, 100, 80));
+  ASSERT_TRUE(WaitFor([&] { return view->draws > 0; }));
+  const OS_Point inside = mLayer->ClientToScreen(window->GetHandle(), OS_Point(30 + 25, 20 + 35));
+  MovePointer(static_cast<int>(inside.x), static_cast<int>(inside.y));
+  Settle(50);
+  Button(1, true);
+  Button(1, false);
+  ASSERT_TRUE(WaitFor([&] { return !view->presses.empty(); })) << "the surface kept the click from the view";
+  EXPECT_FLOAT_EQ(view->presses.front().x, 25.0f);
+  EXPECT_FLOAT_EQ(view->presses.front().y, 35.0f);
 }
 
 TEST_F(X11OpenGLView, MovingTheViewToAnotherWindowRebuildsTheContextAndKeepsDrawing) {

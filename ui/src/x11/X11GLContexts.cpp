@@ -4,6 +4,9 @@
 #include <GL/glx.h>
 
 #include <algorithm>
+#include <map>
+#include <set>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -13,16 +16,28 @@ namespace {
 // X errors on the GL connection (a surface whose parent went away, a
 // refused format) are counted, not fatal; errors of other displays go to
 // whoever handled them before.
-Display* gTrappedDisplay = nullptr;
+std::set<Display*> gTrappedDisplays;
 XErrorHandler gPreviousHandler = nullptr;
 int gErrorCount = 0;
 
 int TrapError(Display* inDisplay, XErrorEvent* inError) {
-  if (inDisplay == gTrappedDisplay) {
+  if (gTrappedDisplays.count(inDisplay)) {
     ++gErrorCount;
     return 0;
   }
   return gPreviousHandler ? gPreviousHandler(inDisplay, inError) : 0;
+}
+
+// The GL connection of each display name, opened once and kept for the life
+// of the process: a GL driver is loaded per connection, and drivers do not
+// all release what they made when they are unloaded again.
+Display* SharedDisplay(const std::string& inName) {
+  static std::map<std::string, Display*> sDisplays;
+  auto found = sDisplays.find(inName);
+  if (found != sDisplays.end()) return found->second;
+  Display* display = XOpenDisplay(inName.empty() ? nullptr : inName.c_str());
+  if (display) sDisplays[inName] = display;
+  return display;
 }
 
 Display* AsDisplay(void* inDisplay) { return static_cast<Display*>(inDisplay); }
@@ -56,31 +71,22 @@ X11GLContexts::~X11GLContexts() {
     XDestroyWindow(display, static_cast<Window>(surface));
     XFreeColormap(display, info.colormap);
   }
+  // The connection stays open for the next layer on this display.
   XSync(display, False);
-  XCloseDisplay(display);
-  if (gTrappedDisplay == display) {
-    XSetErrorHandler(gPreviousHandler);
-    gTrappedDisplay = nullptr;
-    gPreviousHandler = nullptr;
-  }
 }
 
 bool X11GLContexts::IsAvailable() {
   if (mTried) return mAvailable;
   mTried = true;
-  Display* display = XOpenDisplay(mDisplayName.empty() ? nullptr : mDisplayName.c_str());
+  Display* display = SharedDisplay(mDisplayName);
   if (!display) return false;
   int errorBase = 0, eventBase = 0, major = 0, minor = 0;
   if (!glXQueryExtension(display, &errorBase, &eventBase) || !glXQueryVersion(display, &major, &minor) ||
-      major < 1 || (major == 1 && minor < 3)) {
-    XCloseDisplay(display);
+      major < 1 || (major == 1 && minor < 3))
     return false;
-  }
   mDisplay = display;
-  if (!gTrappedDisplay) {
-    gTrappedDisplay = display;
-    gPreviousHandler = XSetErrorHandler(&TrapError);
-  }
+  if (gTrappedDisplays.empty()) gPreviousHandler = XSetErrorHandler(&TrapError);
+  gTrappedDisplays.insert(display);
   mAvailable = true;
   return true;
 }

@@ -1,7 +1,7 @@
 #pragma once
 // GLX for the X11 layer. GLX speaks through an Xlib display while the layer
 // speaks xcb, so GL has a connection of its own to the same server, opened
-// on first use. A surface is a child window of the view's window, with the
+// on first use and shared by every layer on that display. A surface is a child window of the view's window, with the
 // visual of the chosen GLX frame-buffer configuration; it asks for no input,
 // so pointer and key events go on to the view's window beneath it.
 //
