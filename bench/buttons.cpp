@@ -6,7 +6,6 @@
 #include <benchmark/benchmark.h>
 
 #include "ButtonsView.h"
-#include "GalleryResources.h"
 #include "controls/UI_ControlView.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
@@ -68,7 +67,6 @@ class ButtonsPage {
 class Program {
  public:
   Program() : mTheme(norvik::ui::MakeDefaultKeyframeTheme()) {
-    norvik::gallery::ProvideImageResources(mManager);
     norvik::ui::Theme::Initialize(mTheme);
     mTheme->SetBrightness(0);
     mTheme->NotifyThemeChanged();

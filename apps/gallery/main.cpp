@@ -10,7 +10,6 @@
 
 #include "GalleryOptions.h"
 #include "GalleryPage.h"
-#include "GalleryResources.h"
 #include "GalleryWindow.h"
 #include "tarsel/ThrowError.h"
 #include "ui/HeadlessWindowSystem.h"
@@ -101,7 +100,6 @@ int main(int argc, char** argv) {
   }
   try {
     ui::OS_NodeManager manager;
-    gallery::ProvideImageResources(manager);
     ui::KeyframeThemeEditorP theme = ui::MakeDefaultKeyframeTheme();
     ui::Theme::Initialize(theme);
     std::string path = options.screenshot;

@@ -12,6 +12,8 @@
 #include "drawbot/DrawbotWrappers.h"
 #include "support/controls/ControlTestSupport.h"
 #include "support/drawbot/PixelCompare.h"
+#include "ui/HeadlessWindowSystem.h"
+#include "ui/OS_NodeManager.h"
 
 namespace norvik::controls::test {
 namespace {
@@ -97,6 +99,51 @@ TEST_F(PictureButtonTest, ALockButtonTogglesAndPaintsAGlyphWhenItsImageIsMissing
   for (int y = 0; y < 20; ++y)
     for (int x = 0; x < 20; ++x) painted += snapshot.At(x, y) != 0xFFFFFFFFu ? 1 : 0;
   EXPECT_GT(painted, 10) << "the vector lock stands in for the image";
+}
+
+// The manager an application makes carries the toolkit's pictures: the lock
+// shows its artwork for each state, not the stand-in glyph.
+TEST(LockButtonArtwork, UnderThePlatformManagerTheLockShowsItsPicturesNotTheGlyph) {
+  ui::OS_NodeManager manager;
+  ui::HeadlessWindowSystem system;
+  system.Install();
+  boost::intrusive_ptr<UI_LockButton> lock(new UI_LockButton);
+  lock->UI_SetLocalRectF(RectF(0, 0, 20, 20));
+  lock->UI_Show(true);
+  PixelCanvas canvas(20, 20);
+  auto paint = [&] {
+    canvas.Clear(0x808080);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    lock->UI_Draw(&drawbot);
+    return canvas.Snapshot();
+  };
+  auto differing = [](const drawbot::testing::PixelImage& inA, const drawbot::testing::PixelImage& inB) {
+    int count = 0;
+    for (int y = 0; y < inA.height; ++y)
+      for (int x = 0; x < inA.width; ++x) count += inA.At(x, y) != inB.At(x, y) ? 1 : 0;
+    return count;
+  };
+  const int iconType = lock->UI_GetCurrentTheme()->GetIconType();
+
+  const drawbot::ImageInterface* unlocked = lock->GetImage();
+  ASSERT_NE(unlocked, nullptr);
+  EXPECT_EQ(unlocked, manager.GetImage(manager.GetOSDrawSupplier(), UI_LockButton::ImageName(false, false, iconType),
+                                       drawbot::kImageFileTypePNG));
+  const auto unlockedPixels = paint();
+
+  lock->SetValue(UI_Button::kButtonOn);
+  const drawbot::ImageInterface* locked = lock->GetImage();
+  ASSERT_NE(locked, nullptr);
+  EXPECT_NE(locked, unlocked);
+  const auto lockedPixels = paint();
+  EXPECT_GT(differing(lockedPixels, unlockedPixels), 4) << "the locked picture is another picture";
+
+  // Without the cache the same button falls back on the glyph.
+  manager.TerminateDrawing();
+  ASSERT_EQ(lock->GetImage(), nullptr);
+  const auto glyphPixels = paint();
+  EXPECT_GT(differing(lockedPixels, glyphPixels), 10) << "the artwork is not the stand-in glyph";
+  system.Uninstall();
 }
 
 }  // namespace

@@ -354,6 +354,7 @@ TEST_F(UserResizing, RepaintsAreDeferredToTheEndOfTheOutermostResize) {
 using ManagerSeams = ManagerTest;
 
 TEST_F(ManagerSeams, WithoutAResourceManagerAccessRaisesTheResourceError) {
+  manager.SetResourceManager(nullptr);
   try {
     manager.GetResourceManager();
     FAIL() << "expected an error";

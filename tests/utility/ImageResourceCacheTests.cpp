@@ -14,6 +14,7 @@
 #include "tarsel/Contract.h"
 #include "tarsel/ThrowError.h"
 #include "ui/DrawbotImageResourceCache.h"
+#include "ui/OS_NodeManager.h"
 #include "ui/UI_NodeManager.h"
 #include "utility/OS_ResourceManager.h"
 
@@ -156,6 +157,18 @@ TEST(NodeManagerImages, GetImageGoesThroughTheManagersCacheAndResources) {
   EXPECT_EQ(manager.GetImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG), image);
   EXPECT_EQ(manager.GetDrawbotImageResourceCache()->FindImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG).get(),
             image);
+}
+
+TEST(NodeManagerImages, ThePlatformManagerReadsTheLibrarysOwnPicturesAsBuilt) {
+  ui::OS_NodeManager manager;
+  auto* resources = dynamic_cast<OS_ResourceManager*>(&manager.GetResourceManager());
+  ASSERT_NE(resources, nullptr) << "the utility layer installs the library's own reader";
+  EXPECT_EQ(resources->GetModule(), tarsel::resources::kThisModule);
+  const drawbot::ImageInterface* image =
+      manager.GetImage(manager.GetOSDrawSupplier(), "RV4_Locked_Sm_N", kImageFileTypePNG);
+  ASSERT_NE(image, nullptr);
+  EXPECT_EQ(image->GetWidth(), 16u);
+  EXPECT_EQ(manager.GetDrawbotImageResourceCache()->GetSize(), 1u);
 }
 
 TEST(NodeManagerImages, WithoutAResourceManagerGetImageRaisesTheAccessError) {

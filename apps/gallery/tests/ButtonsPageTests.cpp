@@ -7,7 +7,6 @@
 
 #include "ButtonsView.h"
 #include "GalleryPage.h"
-#include "GalleryResources.h"
 #include "GalleryWindow.h"
 #include "PageSelector.h"
 #include "controls/UI_ButtonBar.h"
@@ -57,7 +56,6 @@ int LumaSpread(const ui::HeadlessPixels& inPixels, const RectL& inRect) {
 class ButtonsPageTest : public ::testing::Test {
  protected:
   void Open(bool inLight, long inWidth = 1120, long inHeight = 720) {
-    ProvideImageResources(manager);
     theme = ui::MakeDefaultKeyframeTheme();
     ui::Theme::Initialize(theme);
     system.Install();
