@@ -6,7 +6,8 @@
 //
 // Layout: the buttons stand side by side from the bar's left edge, all as
 // wide as the widest button's recommended width and as high as the highest,
-// so the segments look alike whatever their labels. The bar paints the
+// so the segments look alike whatever their labels; a bar narrower than that
+// row shares its width out equally among them instead. The bar paints the
 // common frame behind them; each button paints its own face on top.
 //
 // Keyboard: the bar, not its buttons, is the tab stop. A click on a button
@@ -55,6 +56,7 @@ class UI_ButtonBar : public UI_InteractiveControlView {
   // Places the buttons again, for instance after a label changed.
   void LayoutButtons();
 
+  void UI_SizeChanged(const RectF& inLocalRect) override;
   void ChildRemoved(ui::UI_Node* inChild) override;
   bool UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
@@ -75,6 +77,7 @@ class UI_ButtonBar : public UI_InteractiveControlView {
   int AddButton(const UI_ButtonP& inButton, double inValue, const UTF16String& inToolTip);
   int IndexOf(const ui::UI_Node* inNode) const;
   PointF SegmentSize() const;
+  PointF FittedSegmentSize() const;
   // The enabled, visible button next to the selection in direction inStep,
   // or -1 when the row ends first.
   int NeighbourOfSelection(int inStep) const;

@@ -1,6 +1,7 @@
 #include "controls/UI_ButtonBar.h"
 
 #include <algorithm>
+#include <cmath>
 #include <string>
 
 #include "controls/UI_PictureButton.h"
@@ -192,9 +193,25 @@ std::vector<ui::UI_Node::RectF> UI_ButtonBar::LayoutRow(std::size_t inCount, con
   return rects;
 }
 
+// The segments keep their common width while the bar is wide enough; a
+// narrower bar shares its width out among them in whole pixels, so the row
+// never runs past the bar and the frame ends exactly at the last button.
+ui::UI_Node::PointF UI_ButtonBar::FittedSegmentSize() const {
+  PointF size = SegmentSize();
+  const float width = UI_GetLocalRectF(false).width;
+  const float count = static_cast<float>(mButtons.size());
+  if (count > 0 && width > 0 && size.x * count > width) size.x = std::floor(width / count);
+  return size;
+}
+
+void UI_ButtonBar::UI_SizeChanged(const RectF& inLocalRect) {
+  LayoutButtons();
+  UI_InteractiveControlView::UI_SizeChanged(inLocalRect);
+}
+
 void UI_ButtonBar::LayoutButtons() {
   ui::UI_NodeProtector protector(this);
-  const std::vector<RectF> rects = LayoutRow(mButtons.size(), SegmentSize());
+  const std::vector<RectF> rects = LayoutRow(mButtons.size(), FittedSegmentSize());
   const std::vector<Entry> buttons(mButtons);
   for (std::size_t i = 0; i < buttons.size(); ++i) buttons[i].button->UI_SetLocalRectF(rects[i]);
   UI_Invalidate(nullptr, 0);
@@ -224,8 +241,10 @@ void UI_ButtonBar::DrawBarFrame(drawbot::Drawbot& inDrawbot) const {
   DrawParameters::StateFlags state = params.GetControlState();
   state.Clear(kStateRollover);
   params.SetControlState(state);
-  const RectF local = UI_GetLocalRectF(false);
-  params.SetRectF(RectF(0, 0, std::min(GetButtonbarWidth(), local.width), std::min(GetButtonbarHeight(), local.height)));
+  // The frame spans the row as laid out, so no part of it shows beside the
+  // last button.
+  const RectF last = mButtons.back().button->UI_GetLocalRectF(true);
+  params.SetRectF(RectF(0, 0, last.left + last.width, std::min(last.height, UI_GetLocalRectF(false).height)));
   DrawFrame(params, inDrawbot);
 }
 

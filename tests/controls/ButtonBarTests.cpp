@@ -129,6 +129,28 @@ TEST_F(ButtonBarTest, TheFramePaintsTheRowOfButtonsAndNothingBeyond) {
       << "no buttons, no frame";
 }
 
+TEST_F(ButtonBarTest, ANarrowBarSharesItsWidthAndItsFrameEndsWithTheLastButton) {
+  const float natural = bar->GetButtonbarWidth();
+  bar->UI_SetLocalRectF(RectF(5, 20, natural - 20, 40));
+  const RectF first = bar->GetButton(0)->UI_GetLocalRectF(true);
+  const RectF last = bar->GetButton(2)->UI_GetLocalRectF(true);
+  const int right = static_cast<int>(last.left + last.width);
+  EXPECT_LE(right, natural - 20) << "the row keeps inside the bar";
+  EXPECT_GT(right, natural - 20 - 3) << "and fills it but for the rounding";
+  EXPECT_EQ(first.width, last.width);
+  EXPECT_EQ(bar->GetButtonbarWidth(), natural) << "the recommended width does not shrink";
+  // The frame and the buttons end in the same column: no sliver of frame
+  // beside the last button, and no button beyond the frame.
+  const auto image = PaintBar(*bar, 200, 40);
+  const std::string row = drawbot::testing::RowCoverage(image, static_cast<int>(last.height / 2));
+  EXPECT_EQ(row, std::string(right - 1, '#') + std::string(200 - right + 1, '.'));
+
+  // Wide again, the segments take back their common width.
+  bar->UI_SetLocalRectF(RectF(5, 20, 195, 40));
+  const RectF wide = bar->GetButton(2)->UI_GetLocalRectF(true);
+  EXPECT_EQ(wide.left + wide.width, natural);
+}
+
 TEST_F(ButtonBarTest, TheButtonsPaintOverTheFrameAndTheSelectedOneLooksDown) {
   const auto unselected = PaintBar(*bar, 200, 40);
   bar->SetValue(0.5);
