@@ -1,6 +1,8 @@
 // The looks of the buttons, drawn by their stateless Draw routines with no
 // control, in each state, in the dark and the light theme, compared with
 // reference images.
+#include <algorithm>
+#include <cstdlib>
 #include <functional>
 #include <string>
 #include <vector>
@@ -149,6 +151,98 @@ TEST_P(ButtonPixelTest, ButtonBarsInEachState) {
   });
   EXPECT_TRUE(MatchesReference(image, Name("button_bar")));
 }
+
+// ---- disabled looks against each other ----
+
+// How many pixels differ between two images of one size.
+int CountDifferences(const drawbot::testing::PixelImage& inA, const drawbot::testing::PixelImage& inB) {
+  int count = 0;
+  for (int y = 0; y < inA.height; ++y)
+    for (int x = 0; x < inA.width; ++x) count += inA.At(x, y) != inB.At(x, y) ? 1 : 0;
+  return count;
+}
+
+int Luma(std::uint32_t inPixel) {
+  return (static_cast<int>((inPixel >> 16) & 0xFF) * 3 + static_cast<int>((inPixel >> 8) & 0xFF) * 6 +
+          static_cast<int>(inPixel & 0xFF)) /
+         10;
+}
+
+class DisabledLookTest : public ButtonPixelTest {
+ protected:
+  // One cell of kCellWidth x kCellHeight over the theme's background.
+  drawbot::testing::PixelImage Cell(const std::function<void(const RectF&, drawbot::Drawbot&)>& inPaint) {
+    PixelCanvas canvas(kCellWidth, kCellHeight);
+    canvas.Clear(theme->GetColor(4).ToPacked() & 0xFFFFFF);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    inPaint(RectF(4, 2, kCellWidth - 8, kCellHeight - 4), drawbot);
+    return canvas.Snapshot();
+  }
+  drawbot::testing::PixelImage TextButton(unsigned long inState) {
+    return Cell([&](const RectF& inRect, drawbot::Drawbot& inDrawbot) {
+      DrawTextButtonParameters params;
+      params.SetTheme(theme);
+      params.SetRectF(inRect);
+      params.SetControlState(StateFlags(inState));
+      params.SetDrawOutline(true);
+      params.SetText(u"Render");
+      UI_TextButton::Draw(params, inDrawbot);
+    });
+  }
+  drawbot::testing::PixelImage Radio(bool inOn) {
+    return Cell([&](const RectF& inRect, drawbot::Drawbot& inDrawbot) {
+      DrawRadioButtonParams params;
+      params.SetTheme(theme);
+      params.SetRectF(inRect);
+      params.SetControlState(StateFlags(UI_ControlView::kStateDisabled));
+      params.SetText(u"Stereo");
+      params.SetOn(inOn);
+      UI_RadioButton::Draw(params, inDrawbot);
+    });
+  }
+  drawbot::testing::PixelImage Checkbox(bool inOn) {
+    return Cell([&](const RectF& inRect, drawbot::Drawbot& inDrawbot) {
+      DrawCheckBoxParams params;
+      params.SetTheme(theme);
+      params.SetRectF(inRect);
+      params.SetControlState(StateFlags(UI_ControlView::kStateDisabled));
+      params.SetText(u"Loop");
+      params.SetValue(inOn ? UI_Checkbox::kOn : UI_Checkbox::kOff);
+      UI_Checkbox::Draw(params, inDrawbot);
+    });
+  }
+};
+
+// A disabled button that is down has its own outline, fill and ring, so a
+// disabled toggle that is on never reads as one that is off.
+TEST_P(DisabledLookTest, DisabledAndDownDrawsOtherwiseThanDisabled) {
+  const auto up = TextButton(UI_ControlView::kStateDisabled);
+  const auto down = TextButton(UI_ControlView::kStateDisabled | UI_ControlView::kStateDown);
+  EXPECT_GT(CountDifferences(up, down), 200) << "the face of the bevel differs";
+  // The outline alone: the column just inside the left edge of the bevel.
+  int outlineDifferences = 0;
+  for (int y = 6; y < kCellHeight - 6; ++y) outlineDifferences += up.At(5, y) != down.At(5, y) ? 1 : 0;
+  EXPECT_GT(outlineDifferences, 8) << "the outline differs";
+}
+
+TEST_P(DisabledLookTest, ADisabledCheckOrDotStillShows) {
+  EXPECT_GT(CountDifferences(Checkbox(false), Checkbox(true)), 10) << "the tick";
+  EXPECT_GT(CountDifferences(Radio(false), Radio(true)), 6) << "the dot";
+}
+
+// The edge of a disabled radio button stands out from the panel, dimmer than
+// an enabled one but not lost. The light look keeps the palette's soft white
+// edge, which needs only to be there; the dark look must show a clear ring.
+TEST_P(DisabledLookTest, ADisabledRadioButtonShowsItsRing) {
+  const auto image = Radio(false);
+  const int panel = Luma(image.At(0, 0));
+  int strongest = 0;
+  for (int x = 4; x < 4 + 14; ++x) strongest = std::max(strongest, std::abs(Luma(image.At(x, kCellHeight / 2)) - panel));
+  EXPECT_GE(strongest, GetParam() ? 8 : 24) << "panel luma " << panel << ", strongest " << strongest;
+}
+
+INSTANTIATE_TEST_SUITE_P(Themes, DisabledLookTest, ::testing::Values(false, true),
+                         [](const ::testing::TestParamInfo<bool>& inInfo) { return inInfo.param ? "Light" : "Dark"; });
 
 INSTANTIATE_TEST_SUITE_P(Themes, ButtonPixelTest, ::testing::Values(false, true),
                          [](const ::testing::TestParamInfo<bool>& inInfo) { return inInfo.param ? "Light" : "Dark"; });

@@ -185,6 +185,8 @@ TEST_P(ButtonsPageLooks, EveryStateLooksUnlikeTheNormalOneAndTheLabelsStandOut) 
     if (KindShowsState(kind, ShownState::kDisabledOn)) {
       EXPECT_GT(CountDifferences(px, Cell(kind, ShownState::kOn), px, Cell(kind, ShownState::kDisabledOn)), 8)
           << "kind " << k << ": disabled and on looks like on";
+      EXPECT_GT(CountDifferences(px, Cell(kind, ShownState::kDisabled), px, Cell(kind, ShownState::kDisabledOn)), 8)
+          << "kind " << k << ": disabled and on looks like disabled";
     }
     // The kind's name at the left of its row reads against the row.
     const RectF labelRect(6, Grid()->GetCellRect(kind, ShownState::kNormal).top, 100, 14);
@@ -217,6 +219,42 @@ TEST_P(ButtonsPageLooks, APressedTextButtonIsShadedOtherwiseThanItsRollover) {
   const ui::UI_Node* pressed = Grid()->GetSample(ButtonKind::kText, ShownState::kPressed);
   const RectL a = OnPage(rollover, RectF(4, 2, 4, 18)), b = OnPage(pressed, RectF(4, 2, 4, 18));
   EXPECT_GT(CountDifferences(px, a, px, b), 20);
+}
+
+TEST_P(ButtonsPageLooks, TheButtonBarsFrameEndsWithItsLastButton) {
+  Open(GetParam());
+  page->ShowPage(GalleryPageID::kButtons);
+  const ui::HeadlessPixels px = Pixels();
+  for (ShownState state : {ShownState::kNormal, ShownState::kDisabled}) {
+    const auto* bar = dynamic_cast<const controls::UI_ButtonBar*>(Grid()->GetSample(ButtonKind::kButtonBar, state));
+    ASSERT_NE(bar, nullptr);
+    const RectF last = bar->GetButton(static_cast<int>(bar->GetButtonCount()) - 1)->UI_GetLocalRectF(true);
+    const RectF local = bar->UI_GetLocalRectF(false);
+    EXPECT_LE(last.left + last.width, local.width) << "the buttons keep inside the bar";
+    // Right of the last button the cell's own background shows, on every row
+    // of the bar: nothing of the frame is left over there.
+    const RectL beside = OnPage(bar, RectF(last.left + last.width, 0, 6, local.height));
+    const RectL background = OnPage(bar, RectF(last.left + last.width + 8, 0, 1, local.height));
+    int framePixels = 0;
+    for (long y = 0; y < beside.height; ++y)
+      for (long x = 0; x < beside.width; ++x)
+        framePixels += px.At(static_cast<int>(beside.left + x), static_cast<int>(beside.top + y)) !=
+                               px.At(static_cast<int>(background.left), static_cast<int>(background.top + y))
+                           ? 1
+                           : 0;
+    EXPECT_EQ(framePixels, 0) << "state " << static_cast<int>(state);
+  }
+}
+
+TEST_P(ButtonsPageLooks, ADisabledRadioButtonKeepsAVisibleRing) {
+  Open(GetParam());
+  page->ShowPage(GalleryPageID::kButtons);
+  const ui::HeadlessPixels px = Pixels();
+  const ui::UI_Node* radio = Grid()->GetSample(ButtonKind::kRadio, ShownState::kDisabled);
+  const RectF r = radio->UI_GetLocalRectF(false);
+  // The ring alone: the box at the left, without the label.
+  const RectL ring = OnPage(radio, RectF(0, 0, 14, r.height));
+  EXPECT_GT(LumaSpread(px, ring), GetParam() ? 8 : 30);
 }
 
 INSTANTIATE_TEST_SUITE_P(BothLooks, ButtonsPageLooks, ::testing::Values(false, true),
