@@ -1,24 +1,19 @@
 // Node tree costs: coordinate mapping through a deep chain, hit-testing a wide
 // container, a repeated invalidation cut short by the draw-cache seed, and the
 // memory of a bare view.
-#include <cstdlib>
-#include <new>
 #include <vector>
 
 #include <benchmark/benchmark.h>
 
 #include "ui/OS_NodeManager.h"
 #include "ui/UI_SubView.h"
+#include "support/HeapCounter.h"
 
 using namespace norvik::ui;
 using PointF = tarsel::geom::PointT<float>;
 using RectF = tarsel::geom::RectT<float>;
 
 namespace {
-
-// Counts heap bytes while armed, to measure what one view costs.
-std::size_t gHeapBytes = 0;
-bool gCounting = false;
 
 UI_SubViewP MakeShownView(float inX, float inY, float inW, float inH) {
   UI_SubViewP v(new UI_SubView);
@@ -85,12 +80,10 @@ void BM_SubViewMemory(benchmark::State& state) {
   auto parent = MakeShownView(0, 0, 100, 100);
   std::size_t bytes = 0;
   for (auto _ : state) {
-    gHeapBytes = 0;
-    gCounting = true;
+    norvik::bench::StartHeapCount();
     UI_SubViewP child(new UI_SubView);
     parent->ChildPushBack(child);
-    gCounting = false;
-    bytes = gHeapBytes;
+    bytes = norvik::bench::StopHeapCount();
     state.PauseTiming();
     parent->DeleteChildren();
     child.reset();
@@ -102,11 +95,3 @@ void BM_SubViewMemory(benchmark::State& state) {
 BENCHMARK(BM_SubViewMemory);
 
 }  // namespace
-
-void* operator new(std::size_t inSize) {
-  if (gCounting) gHeapBytes += inSize;
-  if (void* p = std::malloc(inSize ? inSize : 1)) return p;
-  throw std::bad_alloc();
-}
-void operator delete(void* inPtr) noexcept { std::free(inPtr); }
-void operator delete(void* inPtr, std::size_t) noexcept { std::free(inPtr); }
