@@ -158,9 +158,15 @@ std::pair<bool, UI_Container::iterator> UI_Container::GetChildHit(bool inRecursi
     UI_Node* child = it->get();
     if (inSkipOSChildren && child->UI_ReceivesEventsFromOS()) continue;
     if (!child->UI_IsShown()) continue;
-    tarsel::geom::ScaleMatrixT<float> m = child->UI_GetSelfToParentMatrix();
-    if (!m.IsInvertible()) continue;  // a view scaled to nothing covers no point
-    tarsel::geom::PointT<float> local = m.Inverse().Transform(ioPoint);
+    const tarsel::geom::ScaleMatrixT<float> m = child->UI_GetSelfToParentMatrix();
+    tarsel::geom::PointT<float> local;
+    if (m.IsTranslationOnly()) {
+      // Most children are only moved: undo the offset instead of inverting.
+      local = tarsel::geom::PointT<float>(ioPoint.x - m.tx, ioPoint.y - m.ty);
+    } else {
+      if (!m.IsInvertible()) continue;  // a view scaled to nothing covers no point
+      local = m.Inverse().Transform(ioPoint);
+    }
     if (!child->UI_HitTest(local)) continue;
     iterator hit = it.base() - 1;
     ioPoint = local;

@@ -44,7 +44,14 @@ UI_Node::Matrix UI_Node::UI_GetSelfToSpecificParentMatrix(const UI_Node* inNode,
   Matrix result;
   for (const UI_Node* node = inNode; node; node = node->UI_GetParentNode()) {
     if (node == inStop) return result;
-    result = node->UI_GetSelfToParentMatrix().Concat(result);
+    const Matrix step = node->UI_GetSelfToParentMatrix();
+    if (step.IsTranslationOnly()) {
+      // A level that only moves adds its offset; no products needed.
+      result.tx += step.tx;
+      result.ty += step.ty;
+    } else {
+      result = step.Concat(result);
+    }
   }
   if (inStop) {
     tarsel::config::ThrowError(tarsel::config::ErrorLevel::kError,
