@@ -65,6 +65,30 @@ TEST_F(MouseDispatchSafetyTest, AFirstChanceHandlerThatDeletesTheChildrenMakesIt
   EXPECT_TRUE(buttonDestroyed);
 }
 
+TEST_F(MouseDispatchSafetyTest, AFirstChanceNodeThatDetachesItselfStillWalksDownAndClimbsBack) {
+  panelPtr->UI_SetStateFlags(panelPtr->UI_GetStateFlags().Set(UI_Node::kStateFirstChanceMouse));
+  panelPtr->onMouse = [this](UI_Node* inTarget, const MouseEvent&) {
+    if (!inTarget) root->ChildRemove(panelPtr);
+    return false;
+  };
+  Click(PointF(35, 35));
+  EXPECT_THAT(log.Texts(), ElementsAre("panel.mouse(-)", "button.mouse(button)", "panel.mouse(button)",
+                                       "root.mouse(button)"));
+  EXPECT_TRUE(panelDestroyed);
+  EXPECT_TRUE(buttonDestroyed);
+}
+
+TEST_F(MouseDispatchSafetyTest, ACursorHandlerThatDeletesTheWholeBranchStillReachesTheRoot) {
+  buttonPtr->onCursor = [this](UI_Node*, const PointF&, UI_Node::ModKeys) {
+    root->DeleteChildren();
+    return false;
+  };
+  EXPECT_FALSE(root->UI_DispatchCursor(PointF(35, 35), {}, true));
+  EXPECT_THAT(log.Texts("cursor"), ElementsAre("button.cursor(button)", "panel.cursor(button)", "root.cursor(button)"));
+  EXPECT_TRUE(panelDestroyed);
+  EXPECT_TRUE(buttonDestroyed);
+}
+
 TEST_F(MouseDispatchSafetyTest, AnAncestorThatDetachesItselfOnTheWayUpDoesNotCutTheClimbShort) {
   panelPtr->onMouse = [this](UI_Node*, const MouseEvent&) {
     root->ChildRemove(panelPtr);

@@ -5,7 +5,9 @@
 // Every step holds a strong reference to the node it is on, and the leaf is
 // carried as a strong reference too: a handler may remove or delete its own
 // node, the leaf or an ancestor, and the rest of the pass must still only
-// touch live nodes.
+// touch live nodes. Each reference is taken once, by the step that walks onto
+// the node; the helpers below run on nodes their caller already holds, so
+// they take none of their own (every count change is an atomic operation).
 #include <utility>
 #include <vector>
 
@@ -26,22 +28,32 @@ UI_NodeP ChildUnder(UI_Node* inNode, bool inSkipOSChildren, UI_Node::PointF& ioP
   return hit ? *it : UI_NodeP();
 }
 
-// Delivery of a mouse event to inNode for target inTarget at inPoint, in
-// inNode's coordinates. The filters run when the delivery is to the leaf
-// itself; a disabled node never sees the event, though the walk goes on past it.
+// The custom mouse function, then UI_DoMouseEvent, on a node the caller holds.
+bool MouseEventToHeldNode(UI_Node* inNode, UI_Node* inLeaf, const MouseEvent& inEvent) {
+  // Held by copy: the function may replace itself while it runs.
+  if (UI_Node::CustomMouseFunction custom = inNode->UI_GetCustomMouseEventFunction()) {
+    bool tookOver = false;
+    bool result = (*custom)(inLeaf, inEvent, tookOver);
+    if (tookOver) return result;
+  }
+  return inNode->UI_DoMouseEvent(inLeaf, inEvent);
+}
+
+// Delivery of a mouse event to inNode (held by the caller) for target
+// inTarget at inPoint, in inNode's coordinates. The filters run when the
+// delivery is to the leaf itself; a disabled node never sees the event,
+// though the walk goes on past it.
 bool DeliverMouseEvent(UI_Node* inNode, UI_Node* inTarget, const MouseEvent& inEvent, const UI_Node::PointF& inPoint) {
-  UI_NodeP protector(inNode);
   MouseEvent copy(inEvent);
   copy.SetPosition(inPoint);
   if (inNode == inTarget && UI_Node::UI_DispatchPreMouseEvent(inTarget, copy)) return true;
   if (inNode->UI_GetStateFlags().TestAny(kStateDisabled)) return false;
-  return UI_Node::UI_DispatchMouseEventToLeaf(inNode, inTarget, copy);
+  return MouseEventToHeldNode(inNode, inTarget, copy);
 }
 
 // The cursor is delivered like a mouse event, but to disabled nodes too, and
-// without filters.
+// without filters; inNode is held by the caller.
 bool DeliverCursor(UI_Node* inNode, UI_Node* inTarget, const UI_Node::PointF& inPoint, UI_Node::ModKeys inModKeys) {
-  UI_NodeP protector(inNode);
   if (UI_Node::CustomCursorFunction custom = inNode->UI_GetCustomDoCursorFunction()) {
     bool tookOver = false;
     bool result = (*custom)(inTarget, inPoint, inModKeys, tookOver);
@@ -68,6 +80,46 @@ bool ClimbTowardsRoot(UI_Node* inStart, UI_Node::PointF inPoint, Deliver&& inDel
   return false;
 }
 
+// The walk towards the leaf below inSelf, which the caller holds; each child
+// walked onto is held for the length of its own walk. Answers whether a node
+// handled the event, and the leaf.
+std::pair<bool, UI_NodeP> MouseTowardsLeaf(const UI_NodeP& inSelf, const MouseEvent& inEvent, bool inSkipOSChildren) {
+  UI_Node* node = inSelf.get();
+  const UI_Node::PointF& point = inEvent.GetPosition();
+  const bool firstChance = node->UI_GetStateFlags().Test(UI_Node::kStateFirstChanceMouse);
+  if (firstChance && DeliverMouseEvent(node, nullptr, inEvent, point)) return {true, inSelf};
+
+  UI_Node::PointF childPoint = point;
+  if (UI_NodeP child = ChildUnder(node, inSkipOSChildren, childPoint)) {
+    MouseEvent childEvent(inEvent);
+    childEvent.SetPosition(childPoint);
+    std::pair<bool, UI_NodeP> result = MouseTowardsLeaf(child, childEvent, inSkipOSChildren);
+    if (result.first) return result;
+    // An unhandled event climbs to this node; it never falls through to a
+    // sibling underneath the child that was hit.
+    result.first = DeliverMouseEvent(node, result.second.get(), inEvent, point);
+    return result;
+  }
+  return {DeliverMouseEvent(node, node, inEvent, point), inSelf};
+}
+
+// The cursor's walk towards the leaf, as MouseTowardsLeaf.
+std::pair<bool, UI_NodeP> CursorTowardsLeaf(const UI_NodeP& inSelf, const UI_Node::PointF& inPoint,
+                                            UI_Node::ModKeys inModKeys, bool inSkipOSChildren) {
+  UI_Node* node = inSelf.get();
+  const bool firstChance = node->UI_GetStateFlags().Test(UI_Node::kStateFirstChanceMouse);
+  if (firstChance && DeliverCursor(node, nullptr, inPoint, inModKeys)) return {true, inSelf};
+
+  UI_Node::PointF childPoint = inPoint;
+  if (UI_NodeP child = ChildUnder(node, inSkipOSChildren, childPoint)) {
+    std::pair<bool, UI_NodeP> result = CursorTowardsLeaf(child, childPoint, inModKeys, inSkipOSChildren);
+    if (result.first) return result;
+    result.first = DeliverCursor(node, result.second.get(), inPoint, inModKeys);
+    return result;
+  }
+  return {DeliverCursor(node, node, inPoint, inModKeys), inSelf};
+}
+
 }  // namespace
 
 bool UI_Node::UI_DispatchMouseEvent(const MouseEvent& inEvent, bool inSkipOSChildren) {
@@ -90,22 +142,7 @@ bool UI_Node::UI_DispatchMouseEventToTarget(UI_Node* inNode, const MouseEvent& i
 
 std::pair<bool, UI_NodeP> UI_Node::UI_DispatchMouseEventTowardsLeaf(const MouseEvent& inEvent, bool inSkipOSChildren) {
   UI_NodeP self(this);
-  const PointF& point = inEvent.GetPosition();
-  if (mStateFlags.Test(kStateFirstChanceMouse) && DeliverMouseEvent(this, nullptr, inEvent, point))
-    return {true, self};
-
-  PointF childPoint = point;
-  if (UI_NodeP child = ChildUnder(this, inSkipOSChildren, childPoint)) {
-    MouseEvent childEvent(inEvent);
-    childEvent.SetPosition(childPoint);
-    std::pair<bool, UI_NodeP> result = child->UI_DispatchMouseEventTowardsLeaf(childEvent, inSkipOSChildren);
-    if (result.first) return result;
-    // An unhandled event climbs to this node; it never falls through to a
-    // sibling underneath the child that was hit.
-    result.first = DeliverMouseEvent(this, result.second.get(), inEvent, point);
-    return result;
-  }
-  return {DeliverMouseEvent(this, this, inEvent, point), self};
+  return MouseTowardsLeaf(self, inEvent, inSkipOSChildren);
 }
 
 bool UI_Node::UI_DispatchMouseEventTowardsRoot(UI_Node* inLeaf, const MouseEvent& inEvent) {
@@ -117,13 +154,7 @@ bool UI_Node::UI_DispatchMouseEventTowardsRoot(UI_Node* inLeaf, const MouseEvent
 
 bool UI_Node::UI_DispatchMouseEventToLeaf(UI_Node* inNode, UI_Node* inLeaf, const MouseEvent& inEvent) {
   UI_NodeP protector(inNode);
-  // Held by copy: the function may replace itself while it runs.
-  if (CustomMouseFunction custom = inNode->mCustomMouseEvent) {
-    bool tookOver = false;
-    bool result = (*custom)(inLeaf, inEvent, tookOver);
-    if (tookOver) return result;
-  }
-  return inNode->UI_DoMouseEvent(inLeaf, inEvent);
+  return MouseEventToHeldNode(inNode, inLeaf, inEvent);
 }
 
 bool UI_Node::UI_DispatchPreMouseEvent(UI_Node* inLeaf, const MouseEvent& inEvent) {
@@ -157,17 +188,7 @@ bool UI_Node::UI_DispatchCursor(const PointF& inPoint, ModKeys inModKeys, bool i
 std::pair<bool, UI_NodeP> UI_Node::UI_DispatchCursorTowardsLeaf(const PointF& inPoint, ModKeys inModKeys,
                                                                 bool inSkipOSChildren) {
   UI_NodeP self(this);
-  if (mStateFlags.Test(kStateFirstChanceMouse) && DeliverCursor(this, nullptr, inPoint, inModKeys))
-    return {true, self};
-
-  PointF childPoint = inPoint;
-  if (UI_NodeP child = ChildUnder(this, inSkipOSChildren, childPoint)) {
-    std::pair<bool, UI_NodeP> result = child->UI_DispatchCursorTowardsLeaf(childPoint, inModKeys, inSkipOSChildren);
-    if (result.first) return result;
-    result.first = DeliverCursor(this, result.second.get(), inPoint, inModKeys);
-    return result;
-  }
-  return {DeliverCursor(this, this, inPoint, inModKeys), self};
+  return CursorTowardsLeaf(self, inPoint, inModKeys, inSkipOSChildren);
 }
 
 bool UI_Node::UI_DispatchCursorTowardsRoot(UI_Node* inLeaf, const PointF& inPoint, ModKeys inModKeys) {
