@@ -12,6 +12,7 @@
 // reference to the node it is on, because the callee may remove or delete it.
 #include <cstdint>
 #include <list>
+#include <memory>
 #include <utility>
 #include <vector>
 
@@ -138,8 +139,8 @@ class UI_Node : public UI_NodeBase {
   virtual void UI_SetCapture() = 0;
   virtual void UI_ReleaseCapture() = 0;
   virtual bool UI_ReceivesEventsFromOS() const = 0;
-  virtual const UTF16String& UI_GetToolTip() const { return mToolTip; }
-  virtual long UI_GetToolTipWidth() const { return mToolTipWidth; }
+  virtual const UTF16String& UI_GetToolTip() const;
+  virtual long UI_GetToolTipWidth() const;
   virtual void UI_SetToolTip(const UTF16String& inText, long inWidth);
   virtual PointF UI_GetRecommendedSize() const { return PointF(0, 0); }
   virtual void UI_SetDropTarget(bool) {}
@@ -244,23 +245,24 @@ class UI_Node : public UI_NodeBase {
   bool UI_IsHidden() const { return !UI_IsShown(); }
 
   // ---- callbacks ----
-  void UI_SetCustomDrawFunction(const CustomDrawFunction& inF) { mCustomDraw = inF; }
-  const CustomDrawFunction& UI_GetCustomDrawFunction() const { return mCustomDraw; }
-  void UI_SetCustomMouseEventFunction(const CustomMouseFunction& inF) { mCustomMouseEvent = inF; }
-  const CustomMouseFunction& UI_GetCustomMouseEventFunction() const { return mCustomMouseEvent; }
-  void UI_SetCustomPreMouseEventFunction(const CustomMouseFunction& inF) { mCustomPreMouseEvent = inF; }
-  const CustomMouseFunction& UI_GetCustomPreMouseEventFunction() const { return mCustomPreMouseEvent; }
-  void UI_SetCustomKeyboardEventFunction(const CustomKeyboardFunction& inF) { mCustomKeyboardEvent = inF; }
-  const CustomKeyboardFunction& UI_GetCustomKeyboardEventFunction() const { return mCustomKeyboardEvent; }
-  void UI_SetCustomDoCursorFunction(const CustomCursorFunction& inF) { mCustomDoCursor = inF; }
-  const CustomCursorFunction& UI_GetCustomDoCursorFunction() const { return mCustomDoCursor; }
-  void InstallTimerFunction(const TimerFunction& inF) { mTimerFunctions.push_back(inF); }
-  void InstallFocusChangedFunction(const FocusChangedFunction& inF) { mFocusChangedFunctions.push_back(inF); }
-  void InstallSizeChangedFunction(const VoidFunction& inF) { mSizeChangedFunctions.push_back(inF); }
-  void InstallDisabledChangedFunction(const VoidFunction& inF) { mDisabledChangedFunctions.push_back(inF); }
-  void InstallBeforeFocusChangeFunction(const BeforeFocusChangeFunction& inF) {
-    mBeforeFocusChangeFunctions.push_back(inF);
-  }
+  // The callbacks, tool tip, timers and placement of a node live in a side
+  // block that the node allocates the first time one is set: most nodes
+  // never use them, and a bare node stays small.
+  void UI_SetCustomDrawFunction(const CustomDrawFunction& inF);
+  const CustomDrawFunction& UI_GetCustomDrawFunction() const;
+  void UI_SetCustomMouseEventFunction(const CustomMouseFunction& inF);
+  const CustomMouseFunction& UI_GetCustomMouseEventFunction() const;
+  void UI_SetCustomPreMouseEventFunction(const CustomMouseFunction& inF);
+  const CustomMouseFunction& UI_GetCustomPreMouseEventFunction() const;
+  void UI_SetCustomKeyboardEventFunction(const CustomKeyboardFunction& inF);
+  const CustomKeyboardFunction& UI_GetCustomKeyboardEventFunction() const;
+  void UI_SetCustomDoCursorFunction(const CustomCursorFunction& inF);
+  const CustomCursorFunction& UI_GetCustomDoCursorFunction() const;
+  void InstallTimerFunction(const TimerFunction& inF);
+  void InstallFocusChangedFunction(const FocusChangedFunction& inF);
+  void InstallSizeChangedFunction(const VoidFunction& inF);
+  void InstallDisabledChangedFunction(const VoidFunction& inF);
+  void InstallBeforeFocusChangeFunction(const BeforeFocusChangeFunction& inF);
   void NotifyFocusChanged(UI_Node* inNode, FocusChangeReason inReason);
 
   void UI_SetTabOrderWeight(std::uint64_t inWeight) { mTabOrderWeight = inWeight; }
@@ -396,8 +398,8 @@ class UI_Node : public UI_NodeBase {
   // end of the resize; answers whether it was.
   bool UI_PerformUserResizingDraw();
 
-  const std::list<long>& UI_GetTimerIDs() const { return mTimerIDs; }
-  std::list<long>& UI_GetTimerIDs() { return mTimerIDs; }
+  const std::list<long>& UI_GetTimerIDs() const;
+  std::list<long>& UI_GetTimerIDs();
   void UI_SetClientOSEventFunction(void (*inFunc)(OS_Event*)) { mClientOSEventFunc = inFunc; }
 
  protected:
@@ -409,19 +411,19 @@ class UI_Node : public UI_NodeBase {
                                        std::vector<UI_NodeP>& ioChanged, FocusChangeReason inReason);
   static void UI_DispatchFocusChange(const std::vector<UI_NodeP>& inChanged, FocusChangeReason inReason);
 
-  std::list<long> mTimerIDs;
+  struct Extras;
+  // The side block, created on first write; a node without one reads as
+  // having an empty one.
+  Extras& UI_GetExtras();
+  const Extras& UI_ReadExtras() const;
+
+  std::unique_ptr<Extras> mExtras;
   void (*mClientOSEventFunc)(OS_Event*) = nullptr;
   UI_Container* mParent = nullptr;
   int mIndex = -1;
   StateFlags mStateFlags;
   UTF8String mNodeID;
-  UTF16String mToolTip;
-  long mToolTipWidth = 0;
   bool mHasKeyboardFocus = false;
-  std::vector<TimerFunction> mTimerFunctions;
-  std::vector<FocusChangedFunction> mFocusChangedFunctions;
-  std::vector<VoidFunction> mSizeChangedFunctions;
-  std::vector<VoidFunction> mDisabledChangedFunctions;
   boost::intrusive_ptr<drawbot::CacheInterface> mDrawbotCache;
   std::uint64_t mCacheThemeChangeCount = 0;
   ThemeP mCacheTheme;
@@ -429,14 +431,6 @@ class UI_Node : public UI_NodeBase {
   bool mClipToSelf = false;
   // Starts at a value the seed never takes, so the constructor's invalidation runs.
   std::uint64_t mDrawbotCacheInvalidatedSeed = ~std::uint64_t(0);
-  CustomDrawFunction mCustomDraw;
-  CustomMouseFunction mCustomMouseEvent;
-  CustomMouseFunction mCustomPreMouseEvent;
-  CustomKeyboardFunction mCustomKeyboardEvent;
-  std::vector<BeforeFocusChangeFunction> mBeforeFocusChangeFunctions;
-  CustomCursorFunction mCustomDoCursor;
-  bool mPlacementValid = false;
-  halvorn::place_data_t mPlacement;
   boost::any mUserData;
   std::uint64_t mTabOrderWeight = 0;
 };

@@ -6,6 +6,7 @@
 #include "drawbot/CacheInterface.h"
 #include "tarsel/ThrowError.h"
 #include "ui/UI_NodeManager.h"
+#include "ui/src/UI_NodeExtras.h"
 
 namespace norvik::ui {
 
@@ -126,30 +127,30 @@ void UI_Node::UI_DispatchNodeChange(NodeChange inChange) {
 
 void UI_Node::NotifyFocusChanged(UI_Node* inNode, FocusChangeReason inReason) {
   UI_NodeProtector protect(this);
-  UI_FireCallbackList(mFocusChangedFunctions, inNode, inReason);
+  UI_FireCallbackList(UI_ReadExtras().focusChangedFunctions, inNode, inReason);
 }
 
 void UI_Node::UI_FocusChanged(FocusChangeReason inReason) { NotifyFocusChanged(this, inReason); }
 
 void UI_Node::UI_NotifyBeforeFocusChangeWithOS(bool inGaining, FocusChangeReason inReason) {
   UI_NodeProtector protect(this);
-  UI_FireCallbackList(mBeforeFocusChangeFunctions, inGaining, inReason);
+  UI_FireCallbackList(UI_ReadExtras().beforeFocusChangeFunctions, inGaining, inReason);
 }
 
 void UI_Node::UI_SizeChanged(const RectF&) {
   UI_NodeProtector protect(this);
-  UI_FireCallbackList(mSizeChangedFunctions);
+  UI_FireCallbackList(UI_ReadExtras().sizeChangedFunctions);
 }
 
 void UI_Node::UI_DisabledStateChanged() {
   UI_NodeProtector protect(this);
   UI_Invalidate(nullptr, 0);
-  UI_FireCallbackList(mDisabledChangedFunctions);
+  UI_FireCallbackList(UI_ReadExtras().disabledChangedFunctions);
 }
 
 bool UI_Node::UI_DoTimerNotify(long inTimerID) {
   UI_NodeProtector protect(this);
-  const std::vector<TimerFunction> copy(mTimerFunctions);
+  const std::vector<TimerFunction> copy(UI_ReadExtras().timerFunctions);
   for (const TimerFunction& f : copy) {
     if (f && (*f)(inTimerID)) return true;
   }
@@ -224,15 +225,16 @@ UI_Node* UI_Node::UI_GetToolTipForDisplay(UI_Node* inNode) {
 }
 
 void UI_Node::UI_SetToolTip(const UTF16String& inText, long inWidth) {
-  if (inText == mToolTip) return;
-  mToolTip = inText;
-  mToolTipWidth = inWidth;
+  if (inText == UI_GetToolTip()) return;
+  Extras& extras = UI_GetExtras();
+  extras.toolTip = inText;
+  extras.toolTipWidth = inWidth;
   UI_NodeManager* manager = UI_NodeManager::Get();
   UI_ToolTipManager* tips = manager ? manager->GetToolTipManager() : nullptr;
   if (!tips) return;
   UI_NodeProtector protect(this);
   if (tips->GetToolTipNode() == this || UI_GetToolTipForDisplay(manager->GetMouseOverLeafNode()) == this) {
-    if (mToolTip.empty()) {
+    if (UI_ReadExtras().toolTip.empty()) {
       tips->DisposeToolTip();
     } else {
       tips->RefreshToolTip(this);
@@ -254,8 +256,9 @@ void UI_Node::measure_vertical(halvorn::extents_t&, const halvorn::place_data_t&
 }
 
 void UI_Node::place(const halvorn::place_data_t& inPlace) {
-  mPlacementValid = true;
-  mPlacement = inPlace;
+  Extras& extras = UI_GetExtras();
+  extras.placementValid = true;
+  extras.placement = inPlace;
   const auto& h = inPlace.horizontal();
   const auto& v = inPlace.vertical();
   UI_SetLocalRectF(RectF(h.position - h.outset_before, v.position - v.outset_before,
@@ -263,15 +266,16 @@ void UI_Node::place(const halvorn::place_data_t& inPlace) {
 }
 
 const halvorn::place_data_t& UI_Node::get_placement() {
-  if (!mPlacementValid) {
+  Extras& extras = UI_GetExtras();
+  if (!extras.placementValid) {
     RectF r = UI_GetLocalRectF(true);
     float left = std::floor(r.left), top = std::floor(r.top);
-    mPlacement.horizontal().position = left;
-    mPlacement.horizontal().length = std::ceil(r.Right()) - left;
-    mPlacement.vertical().position = top;
-    mPlacement.vertical().length = std::ceil(r.Bottom()) - top;
+    extras.placement.horizontal().position = left;
+    extras.placement.horizontal().length = std::ceil(r.Right()) - left;
+    extras.placement.vertical().position = top;
+    extras.placement.vertical().length = std::ceil(r.Bottom()) - top;
   }
-  return mPlacement;
+  return extras.placement;
 }
 
 }  // namespace norvik::ui

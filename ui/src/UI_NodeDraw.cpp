@@ -132,7 +132,7 @@ void UI_Node::UI_DrawSelf(drawbot::Drawbot* inDrawbot, bool inFromRoot, const dr
 void UI_Node::UI_DispatchDraw(drawbot::Drawbot* inDrawbot) {
   UI_NodeProtector protector(this);
   // A copy, so that the function may replace itself while it runs.
-  const CustomDrawFunction custom = mCustomDraw;
+  const CustomDrawFunction custom = UI_GetCustomDrawFunction();
   if (custom && !custom->empty() && (*custom)(this, inDrawbot)) return;
   UI_Draw(inDrawbot);
 }

@@ -37,7 +37,7 @@ bool UI_Node::UI_DispatchKeyboardEvent(UI_Node* inNode, const KeyboardEvent& inE
 
 bool UI_Node::UI_DispatchKeyboardEventToNode(UI_Node* inNode, UI_Node* inTarget, const KeyboardEvent& inEvent) {
   UI_NodeP protector(inNode);
-  if (CustomKeyboardFunction custom = inNode->mCustomKeyboardEvent) {
+  if (CustomKeyboardFunction custom = inNode->UI_GetCustomKeyboardEventFunction()) {
     bool tookOver = false;
     bool result = (*custom)(inTarget, inEvent, tookOver);
     if (tookOver) return result;

@@ -165,7 +165,7 @@ bool UI_Node::UI_DispatchPreMouseEvent(UI_Node* inLeaf, const MouseEvent& inEven
   const std::vector<UI_Node*>& live = manager->GetMouseEventFilters();
   std::vector<UI_NodeP> filters(live.begin(), live.end());
   for (const UI_NodeP& filter : filters) {
-    if (CustomMouseFunction custom = filter->mCustomPreMouseEvent) {
+    if (CustomMouseFunction custom = filter->UI_GetCustomPreMouseEventFunction()) {
       bool tookOver = false;
       bool result = (*custom)(inLeaf, inEvent, tookOver);
       if (tookOver) return result;

@@ -11,6 +11,7 @@
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
 #include "ui/UI_NodeTimerManager.h"
+#include "ui/src/UI_NodeExtras.h"
 
 namespace norvik::ui {
 
@@ -36,25 +37,29 @@ void UI_Node::UI_InstallTimer(float inSeconds, long inTimerID) {
   UI_NodeTimerManager* manager = UI_GetTimerManager(false);
   if (!manager) return;
   // The same id replaces the earlier timer, interval and all.
-  manager->RemoveTimer(this, inTimerID, mTimerIDs);
-  mTimerIDs.push_back(manager->CreateTimer(this, inTimerID, inSeconds));
+  std::list<long>& ids = UI_GetTimerIDs();
+  manager->RemoveTimer(this, inTimerID, ids);
+  ids.push_back(manager->CreateTimer(this, inTimerID, inSeconds));
 }
 
 bool UI_Node::UI_RemoveTimer(long inTimerID, bool inFlag) {
   UI_NodeTimerManager* manager = UI_GetTimerManager(inFlag);
-  return manager && manager->RemoveTimer(this, inTimerID, mTimerIDs);
+  if (!manager) return false;
+  std::list<long> none;
+  return manager->RemoveTimer(this, inTimerID, mExtras ? mExtras->timerIDs : none);
 }
 
 void UI_Node::UI_RemoveAllTimers() {
   if (UI_NodeTimerManager* manager = UI_GetTimerManager(false)) {
-    manager->RemoveAllTimers(this, mTimerIDs);
-  } else {
-    mTimerIDs.clear();
+    std::list<long> none;
+    manager->RemoveAllTimers(this, mExtras ? mExtras->timerIDs : none);
+  } else if (mExtras) {
+    mExtras->timerIDs.clear();
   }
 }
 
 void UI_Node::UI_InstallTimerNotifyFunction(TimerFunction inFunction) {
-  mTimerFunctions.push_back(std::move(inFunction));
+  UI_GetExtras().timerFunctions.push_back(std::move(inFunction));
 }
 
 bool UI_Node::UI_DispatchPossibleTimer(long inTimerKey) {

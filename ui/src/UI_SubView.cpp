@@ -4,6 +4,7 @@
 
 #include "ui/UI_NodeManager.h"
 #include "ui/UI_NodeTimerManager.h"
+#include "ui/src/UI_NodeExtras.h"
 
 namespace norvik::ui {
 
@@ -160,9 +161,10 @@ void UI_SubView::UI_SetParent(UI_Container* inParent) {
 
 void UI_SubView::UI_RemoveSubViewTimers() {
   if (UI_NodeTimerManager* timers = UI_GetTimerManager(false)) {
-    timers->RemoveAllTimers(this, mTimerIDs);
-  } else {
-    mTimerIDs.clear();  // no window above: no timer can be installed anywhere
+    std::list<long> none;
+    timers->RemoveAllTimers(this, mExtras ? mExtras->timerIDs : none);
+  } else if (mExtras) {
+    mExtras->timerIDs.clear();  // no window above: no timer can be installed anywhere
   }
   for (const UI_NodeP& child : mChildren) {
     if (child->UI_IsSubView()) static_cast<UI_SubView*>(child.get())->UI_RemoveSubViewTimers();
