@@ -6,6 +6,7 @@
 // and font sizes for itself; those win over the theme's.
 #include <cstdint>
 #include <map>
+#include <memory>
 
 #include <boost/function.hpp>
 #include <boost/shared_ptr.hpp>
@@ -46,9 +47,15 @@ class ThemeClient {
   const ThemeSupplier& UI_GetThemeSupplier() const { return mThemeSupplier; }
 
  private:
+  // Few clients override entries: the maps are allocated on the first one.
+  struct CustomEntries {
+    std::map<std::uint64_t, drawbot::ColorRGBA> colors;
+    std::map<std::uint64_t, float> fontSizes;
+  };
+  CustomEntries& Custom();
+
   ThemeSupplier mThemeSupplier;
-  std::map<std::uint64_t, drawbot::ColorRGBA> mCustomColors;
-  std::map<std::uint64_t, float> mCustomFontSizes;
+  std::unique_ptr<CustomEntries> mCustom;
   ThemeSupplier mDefaultThemeSupplier;
 };
 

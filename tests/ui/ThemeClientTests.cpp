@@ -87,6 +87,20 @@ TEST_F(ThemeClientTest, SettingTheSameCustomEntryAgainDoesNotNotify) {
   EXPECT_FLOAT_EQ(client.GetThemeFontSize(0), 11);
 }
 
+TEST_F(ThemeClientTest, AClientWithoutCustomEntriesReadsTheThemeAndClearingStillNotifies) {
+  CountingClient client;
+  client.updates = 0;
+  EXPECT_EQ(client.GetThemeColor(19), Theme::Get().GetColor(19));
+  EXPECT_FLOAT_EQ(client.GetThemeFontSize(1), 11);
+  client.ClearCustomThemeColor(19);
+  client.ClearCustomFontSize(1);
+  EXPECT_EQ(client.updates, 2);
+  // A colour entry does not answer for a font size of the same id.
+  client.SetCustomThemeColor(1, drawbot::ColorRGBA(1, 0, 0, 1));
+  EXPECT_FLOAT_EQ(client.GetThemeFontSize(1), 11);
+  EXPECT_EQ(client.GetThemeColor(1), drawbot::ColorRGBA(1, 0, 0, 1));
+}
+
 TEST_F(ThemeClientTest, FontNamesComeFromTheThemeOnly) {
   ThemeP theme(new Theme(379, 3));
   theme->SetFontName(2, u"DejaVu Sans");

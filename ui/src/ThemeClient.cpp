@@ -10,13 +10,18 @@ ThemeClient::ThemeClient() { UI_ResetThemeSupplier(); }
 
 ThemeClient::~ThemeClient() = default;
 
+ThemeClient::CustomEntries& ThemeClient::Custom() {
+  if (!mCustom) mCustom = std::make_unique<CustomEntries>();
+  return *mCustom;
+}
+
 void ThemeClient::UI_SetThemeSupplier(const ThemeSupplier& inSupplier) {
   mThemeSupplier = inSupplier;
   UI_ThemeUpdated(1);
 }
 
 void ThemeClient::SetCustomThemeColor(std::uint64_t inID, const drawbot::ColorRGBA& inColor) {
-  auto inserted = mCustomColors.emplace(inID, inColor);
+  auto inserted = Custom().colors.emplace(inID, inColor);
   if (!inserted.second) {
     if (inserted.first->second == inColor) return;
     inserted.first->second = inColor;
@@ -25,12 +30,12 @@ void ThemeClient::SetCustomThemeColor(std::uint64_t inID, const drawbot::ColorRG
 }
 
 void ThemeClient::ClearCustomThemeColor(std::uint64_t inID) {
-  mCustomColors.erase(inID);
+  if (mCustom) mCustom->colors.erase(inID);
   UI_ThemeUpdated(1);
 }
 
 void ThemeClient::SetCustomFontSize(std::uint64_t inID, float inSize) {
-  auto inserted = mCustomFontSizes.emplace(inID, inSize);
+  auto inserted = Custom().fontSizes.emplace(inID, inSize);
   if (!inserted.second) {
     if (inserted.first->second == inSize) return;
     inserted.first->second = inSize;
@@ -39,13 +44,15 @@ void ThemeClient::SetCustomFontSize(std::uint64_t inID, float inSize) {
 }
 
 void ThemeClient::ClearCustomFontSize(std::uint64_t inID) {
-  mCustomFontSizes.erase(inID);
+  if (mCustom) mCustom->fontSizes.erase(inID);
   UI_ThemeUpdated(1);
 }
 
 drawbot::ColorRGBA ThemeClient::GetThemeColor(std::uint64_t inID) const {
-  auto it = mCustomColors.find(inID);
-  if (it != mCustomColors.end()) return it->second;
+  if (mCustom) {
+    auto it = mCustom->colors.find(inID);
+    if (it != mCustom->colors.end()) return it->second;
+  }
   return UI_GetCurrentTheme()->GetColor(inID);
 }
 
@@ -54,8 +61,10 @@ UTF16String ThemeClient::GetThemeFontName(std::uint64_t inID) const {
 }
 
 float ThemeClient::GetThemeFontSize(std::uint64_t inID) const {
-  auto it = mCustomFontSizes.find(inID);
-  if (it != mCustomFontSizes.end()) return it->second;
+  if (mCustom) {
+    auto it = mCustom->fontSizes.find(inID);
+    if (it != mCustom->fontSizes.end()) return it->second;
+  }
   return UI_GetCurrentTheme()->GetFontSize(inID);
 }
 
