@@ -8,6 +8,7 @@
 
 #include "drawbot/DrawbotWrappers.h"
 #include "support/drawbot/PixelCompare.h"
+#include "support/utility/ResourcePixels.h"
 #include "tarsel/ThrowError.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_WindowConstants.h"
@@ -17,7 +18,6 @@
 namespace norvik::utility {
 namespace {
 
-using drawbot::testing::PixelCanvas;
 using drawbot::testing::PixelImage;
 
 struct CursorPicture {
@@ -38,15 +38,7 @@ class CursorDisplay : public ::testing::Test {
 
   // The pixels of a library picture, decoded and drawn the ordinary way.
   PixelImage Decoded(const char16_t* inName) {
-    std::vector<char> bytes;
-    mResources.GetBinary(inName, u"png", &bytes);
-    drawbot::FileImageP probe(drawbot::NewOSSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
-                              static_cast<unsigned long>(bytes.size()));
-    PixelCanvas canvas(static_cast<int>(probe->GetWidth()), static_cast<int>(probe->GetHeight()));
-    drawbot::FileImageP image(canvas.GetSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
-                              static_cast<unsigned long>(bytes.size()));
-    canvas.GetSurface()->DrawImage(*image, tarsel::geom::PointT<float>(0, 0), 1);
-    return canvas.Snapshot();
+    return testing::DecodedResourcePNG(mResources, inName);
   }
 
   ui::HeadlessWindowSystem mSystem;

@@ -8,8 +8,8 @@
 
 #include <gtest/gtest.h>
 
-#include "drawbot/DrawbotWrappers.h"
 #include "support/drawbot/PixelCompare.h"
+#include "support/utility/ResourcePixels.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_WindowConstants.h"
 #include "utility/CursorUtils.h"
@@ -18,7 +18,6 @@
 namespace norvik::utility {
 namespace {
 
-using drawbot::testing::PixelCanvas;
 using drawbot::testing::PixelImage;
 
 struct Shown {
@@ -49,15 +48,7 @@ class NativeCursors : public ::testing::Test {
   }
 
   PixelImage Decoded(const UTF16String& inName) {
-    std::vector<char> bytes;
-    mResources.GetBinary(inName, u"png", &bytes);
-    drawbot::FileImageP probe(drawbot::NewOSSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
-                              static_cast<unsigned long>(bytes.size()));
-    PixelCanvas canvas(static_cast<int>(probe->GetWidth()), static_cast<int>(probe->GetHeight()));
-    drawbot::FileImageP image(canvas.GetSupplier(), drawbot::kImageFileTypePNG, bytes.data(),
-                              static_cast<unsigned long>(bytes.size()));
-    canvas.GetSurface()->DrawImage(*image, tarsel::geom::PointT<float>(0, 0), 1);
-    return canvas.Snapshot();
+    return testing::DecodedResourcePNG(mResources, inName);
   }
 
   ui::HeadlessWindowSystem mSystem;

@@ -1,8 +1,5 @@
 #include "x11/X11BridgeFixture.h"
 
-#include <unistd.h>
-
-#include <chrono>
 #include <cstdlib>
 
 #include "support/ui/XvfbServer.h"
@@ -53,14 +50,7 @@ OS_Point X11BridgeTest::ScreenPoint(const UI_Node* inNode, long inX, long inY) c
 }
 
 bool X11BridgeTest::WaitFor(const std::function<bool()>& inCondition, int inMilliseconds) {
-  const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(inMilliseconds);
-  while (std::chrono::steady_clock::now() < end) {
-    mLayer->ProcessPendingEvents();
-    if (inCondition()) return true;
-    usleep(1000);
-  }
-  mLayer->ProcessPendingEvents();
-  return inCondition();
+  return PumpUntil(*mLayer, inCondition, inMilliseconds);
 }
 
 void X11BridgeTest::Settle(int inMilliseconds) {

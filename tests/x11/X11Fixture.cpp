@@ -1,9 +1,7 @@
 #include "x11/X11Fixture.h"
 
 #include <cairo.h>
-#include <unistd.h>
 
-#include <chrono>
 #include <cstdlib>
 
 #include "support/ui/XvfbServer.h"
@@ -74,14 +72,7 @@ ui::OS_WindowHandle X11Fixture::MakeShownWindow(const ui::OS_Rect& inRect, std::
 }
 
 bool X11Fixture::WaitFor(const std::function<bool()>& inCondition, int inMilliseconds) {
-  const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(inMilliseconds);
-  while (std::chrono::steady_clock::now() < end) {
-    mLayer->ProcessPendingEvents();
-    if (inCondition()) return true;
-    usleep(2000);
-  }
-  mLayer->ProcessPendingEvents();
-  return inCondition();
+  return PumpUntil(*mLayer, inCondition, inMilliseconds);
 }
 
 void X11Fixture::Settle(int inMilliseconds) {

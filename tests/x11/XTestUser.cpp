@@ -4,9 +4,23 @@
 
 #include <unistd.h>
 
+#include <chrono>
 #include <cstdlib>
 
+#include "ui/OS_NativeLayer.h"
+
 namespace norvik::test {
+
+bool PumpUntil(ui::OS_NativeLayer& inLayer, const std::function<bool()>& inCondition, int inMilliseconds) {
+  const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(inMilliseconds);
+  while (std::chrono::steady_clock::now() < end) {
+    inLayer.ProcessPendingEvents();
+    if (inCondition()) return true;
+    usleep(1000);
+  }
+  inLayer.ProcessPendingEvents();
+  return inCondition();
+}
 
 XTestUser::XTestUser(const std::string& inDisplay) : mConnection(xcb_connect(inDisplay.c_str(), nullptr)) {}
 

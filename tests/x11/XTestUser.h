@@ -5,11 +5,21 @@
 #include <xcb/xcb.h>
 
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
 
+namespace norvik::ui {
+class OS_NativeLayer;
+}
+
 namespace norvik::test {
+
+// Runs the layer's pending events until inCondition holds or inMilliseconds
+// pass; answers the condition. What a user did reaches the toolkit only
+// through the layer's loop, so every test waits this way.
+bool PumpUntil(ui::OS_NativeLayer& inLayer, const std::function<bool()>& inCondition, int inMilliseconds);
 
 class XTestUser {
  public:
