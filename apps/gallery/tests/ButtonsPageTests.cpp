@@ -8,6 +8,7 @@
 #include "ButtonsView.h"
 #include "GalleryPage.h"
 #include "GalleryWindow.h"
+#include "GalleryWindowFixture.h"
 #include "PageSelector.h"
 #include "controls/UI_ButtonBar.h"
 #include "controls/UI_Checkbox.h"
@@ -21,11 +22,7 @@ namespace {
 
 using RectL = ui::UI_Node::RectL;
 
-int Luma(std::uint32_t inPixel) {
-  return (static_cast<int>((inPixel >> 16) & 0xFF) * 3 + static_cast<int>((inPixel >> 8) & 0xFF) * 6 +
-          static_cast<int>(inPixel & 0xFF)) /
-         10;
-}
+using testing::Luma;
 
 // How many pixels of inRect differ between two images of one window.
 int CountDifferences(const ui::HeadlessPixels& inA, const RectL& inRectA, const ui::HeadlessPixels& inB,
@@ -53,15 +50,10 @@ int LumaSpread(const ui::HeadlessPixels& inPixels, const RectL& inRect) {
 }
 
 
-class ButtonsPageTest : public ::testing::Test {
+class ButtonsPageTest : public testing::GalleryWindowFixture {
  protected:
   void Open(bool inLight, long inWidth = 1120, long inHeight = 720) {
-    theme = ui::MakeDefaultKeyframeTheme();
-    ui::Theme::Initialize(theme);
-    system.Install();
-    page.reset(new GalleryPage(theme, inLight));
-    window.reset(new GalleryWindow(page, inWidth, inHeight));
-    system.Pump();
+    GalleryWindowFixture::Open(inLight, inWidth, inHeight);
   }
   void TearDown() override {
     if (HasFailure() && window) {
@@ -70,14 +62,7 @@ class ButtonsPageTest : public ::testing::Test {
       const std::string name = ::testing::UnitTest::GetInstance()->current_test_info()->name();
       system.WriteWindowPNG(window->GetHandle(), (dir / (name + ".png")).string());
     }
-    window.reset();
-    page.reset();
-    system.Uninstall();
-    ui::Theme::Terminate();
-  }
-  ui::HeadlessPixels Pixels() {
-    system.Pump();
-    return system.ReadWindowPixels(window->GetHandle());
+    GalleryWindowFixture::TearDown();
   }
   void ClickAt(const ui::UI_Node* inNode, long inX, long inY) {
     const RectL onScreen = inNode->UI_LocalToGlobal(RectL(inX, inY, 1, 1));
@@ -89,14 +74,9 @@ class ButtonsPageTest : public ::testing::Test {
     const RectF r = inNode->UI_GetLocalRectF(false);
     ClickAt(inNode, static_cast<long>(r.width / 2), static_cast<long>(r.height / 2));
   }
-  // A rectangle of a node in the window's client coordinates: nodes in a
-  // window have the screen for their global coordinates.
   RectL OnPage(const ui::UI_Node* inNode, const RectF& inLocal) {
-    const RectL onScreen =
-        inNode->UI_LocalToGlobal(RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
-                                       static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));
-    const ui::OS_Point origin = system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(0, 0));
-    return RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
+    return InWindow(inNode, RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
+                                  static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));
   }
   ButtonGridView* Grid() const { return page->GetButtonsPage()->GetGrid(); }
   // Checks that every kind has a sample in each of its states and nothing
@@ -128,12 +108,6 @@ class ButtonsPageTest : public ::testing::Test {
   RectL Cell(ButtonKind inKind, ShownState inState) {
     return OnPage(Grid(), Grid()->GetCellRect(inKind, inState));
   }
-
-  ui::OS_NodeManager manager;
-  ui::HeadlessWindowSystem system;
-  ui::KeyframeThemeEditorP theme;
-  GalleryPageP page;
-  GalleryWindowP window;
 };
 
 TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {

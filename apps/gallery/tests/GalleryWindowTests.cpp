@@ -12,6 +12,7 @@
 #include "controls/UI_RadioGroup.h"
 #include "controls/UI_TextButton.h"
 #include "GalleryWindow.h"
+#include "GalleryWindowFixture.h"
 #include "PageSelector.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_Event.h"
@@ -25,39 +26,12 @@ namespace {
 constexpr int kVirtualKeyTab = 0x09;
 constexpr int kVirtualKeyShift = 0x10;
 
-int Luma(std::uint32_t inPixel) {
-  return (static_cast<int>((inPixel >> 16) & 0xFF) * 3 + static_cast<int>((inPixel >> 8) & 0xFF) * 6 +
-          static_cast<int>(inPixel & 0xFF)) /
-         10;
-}
+using testing::Luma;
 
-class GalleryWindowTest : public ::testing::Test {
+class GalleryWindowTest : public testing::GalleryWindowFixture {
  protected:
   void Open(bool inLight, long inWidth = 900, long inHeight = 600) {
-    theme = ui::MakeDefaultKeyframeTheme();
-    ui::Theme::Initialize(theme);
-    system.Install();
-    page.reset(new GalleryPage(theme, inLight));
-    window.reset(new GalleryWindow(page, inWidth, inHeight));
-    system.Pump();
-  }
-  void TearDown() override {
-    window.reset();
-    page.reset();
-    system.Uninstall();
-    ui::Theme::Terminate();
-  }
-
-  ui::HeadlessPixels Pixels() {
-    system.Pump();
-    return system.ReadWindowPixels(window->GetHandle());
-  }
-  // A rectangle of a node in the window's client coordinates (the page fills
-  // the client area). Global coordinates of nodes in a window are the screen's.
-  ui::UI_Node::RectL InWindow(const ui::UI_Node* inNode, const ui::UI_Node::RectL& inLocal) {
-    const ui::UI_Node::RectL onScreen = inNode->UI_LocalToGlobal(inLocal);
-    const ui::OS_Point origin = system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(0, 0));
-    return ui::UI_Node::RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
+    GalleryWindowFixture::Open(inLight, inWidth, inHeight);
   }
   // The centre of a node, in screen coordinates.
   ui::OS_Point ScreenCentre(const ui::UI_Node* inNode) {
@@ -79,12 +53,6 @@ class GalleryWindowTest : public ::testing::Test {
     ui::UI_Node* outer = tree->UI_ChildGetFromID(inOuterID);
     return (outer->ChildBegin() + inIndex)->get();
   }
-
-  ui::OS_NodeManager manager;
-  ui::HeadlessWindowSystem system;
-  ui::KeyframeThemeEditorP theme;
-  GalleryPageP page;
-  GalleryWindowP window;
 };
 
 TEST_F(GalleryWindowTest, TheDarkLookPaintsADarkPageWithLightTitleText) {
