@@ -58,17 +58,7 @@ void X11BridgeTest::Settle(int inMilliseconds) {
 }
 
 std::uint32_t X11BridgeTest::ScreenPixel(int inX, int inY) {
-  xcb_connection_t* c = mUser->GetConnection();
-  xcb_get_image_reply_t* image = xcb_get_image_reply(
-      c,
-      xcb_get_image(c, XCB_IMAGE_FORMAT_Z_PIXMAP, mUser->GetRoot(), static_cast<int16_t>(inX),
-                    static_cast<int16_t>(inY), 1, 1, ~0u),
-      nullptr);
-  if (!image) return 0xFFFFFFFF;
-  const std::uint8_t* data = xcb_get_image_data(image);
-  const std::uint32_t pixel = (std::uint32_t(data[2]) << 16) | (std::uint32_t(data[1]) << 8) | data[0];
-  std::free(image);
-  return pixel;
+  return ReadServerPixel(mUser->GetConnection(), mUser->GetRoot(), inX, inY);
 }
 
 }  // namespace norvik::test

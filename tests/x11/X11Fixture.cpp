@@ -95,16 +95,7 @@ void X11Fixture::Key(std::uint32_t inKeysym, bool inPress) {
 }
 
 std::uint32_t X11Fixture::ReadPixel(ui::OS_WindowHandle inWindow, int inX, int inY) {
-  xcb_get_image_reply_t* image = xcb_get_image_reply(
-      mUser,
-      xcb_get_image(mUser, XCB_IMAGE_FORMAT_Z_PIXMAP, static_cast<xcb_drawable_t>(inWindow), static_cast<int16_t>(inX),
-                    static_cast<int16_t>(inY), 1, 1, ~0u),
-      nullptr);
-  if (!image) return 0xFFFFFFFF;
-  const std::uint8_t* data = xcb_get_image_data(image);
-  const std::uint32_t pixel = (std::uint32_t(data[2]) << 16) | (std::uint32_t(data[1]) << 8) | data[0];
-  std::free(image);
-  return pixel;
+  return ReadServerPixel(mUser, static_cast<xcb_drawable_t>(inWindow), inX, inY);
 }
 
 }  // namespace norvik::test

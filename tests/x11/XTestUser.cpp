@@ -22,6 +22,19 @@ bool PumpUntil(ui::OS_NativeLayer& inLayer, const std::function<bool()>& inCondi
   return inCondition();
 }
 
+std::uint32_t ReadServerPixel(xcb_connection_t* inConnection, xcb_drawable_t inDrawable, int inX, int inY) {
+  xcb_get_image_reply_t* image = xcb_get_image_reply(
+      inConnection,
+      xcb_get_image(inConnection, XCB_IMAGE_FORMAT_Z_PIXMAP, inDrawable, static_cast<int16_t>(inX),
+                    static_cast<int16_t>(inY), 1, 1, ~0u),
+      nullptr);
+  if (!image) return 0xFFFFFFFF;
+  const std::uint8_t* data = xcb_get_image_data(image);
+  const std::uint32_t pixel = (std::uint32_t(data[2]) << 16) | (std::uint32_t(data[1]) << 8) | data[0];
+  std::free(image);
+  return pixel;
+}
+
 XTestUser::XTestUser(const std::string& inDisplay) : mConnection(xcb_connect(inDisplay.c_str(), nullptr)) {}
 
 XTestUser::~XTestUser() {

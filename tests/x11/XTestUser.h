@@ -21,6 +21,10 @@ namespace norvik::test {
 // through the layer's loop, so every test waits this way.
 bool PumpUntil(ui::OS_NativeLayer& inLayer, const std::function<bool()>& inCondition, int inMilliseconds);
 
+// One pixel of a drawable as the server holds it, 0xRRGGBB; all ones when
+// the server refuses (an unmapped window, a point outside it).
+std::uint32_t ReadServerPixel(xcb_connection_t* inConnection, xcb_drawable_t inDrawable, int inX, int inY);
+
 class XTestUser {
  public:
   explicit XTestUser(const std::string& inDisplay);
