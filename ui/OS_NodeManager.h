@@ -20,6 +20,9 @@ class OS_NodeManager : public UI_NodeManager {
  public:
   OS_NodeManager();
   ~OS_NodeManager() override = default;
+
+  // The pointer as the native layer reports it now.
+  tarsel::geom::PointT<long> GetGlobalMousePosition() const override;
 };
 
 }  // namespace norvik::ui

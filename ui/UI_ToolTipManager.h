@@ -14,6 +14,8 @@ class UI_ToolTipManager {
   // Shows inNode's current text again; disposes the tip when it cannot be shown.
   virtual void RefreshToolTip(UI_Node* inNode) = 0;
   virtual void DisposeToolTip() = 0;
+  // Seconds a node's own tip waits after the mouse arrives on it.
+  virtual float GetDisplayDelay() const { return 0.75f; }
 };
 
 }  // namespace norvik::ui

@@ -21,11 +21,10 @@ class KeyFocusLock : private boost::noncopyable {
   ui::UI_Node* GetLockedNode() const { return mNode.get(); }
 
  private:
-  // Held strongly: the node may leave the tree while the lock is alive. A
-  // node that is no longer under the root it had does not take focus back,
-  // so that a removed view cannot pull focus out of its old window.
+  // Held strongly: the node may leave the tree while the lock is alive. It
+  // is asked to take focus back wherever it now stands; whether it can is
+  // its own answer.
   boost::intrusive_ptr<ui::UI_Node> mNode;
-  boost::intrusive_ptr<ui::UI_Node> mRoot;
 };
 
 }  // namespace norvik::utility

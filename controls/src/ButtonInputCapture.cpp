@@ -26,8 +26,8 @@ void ButtonInputCapture::Begin() {
   button->UI_Invalidate(nullptr, 0);
 }
 
-// The look follows the hit test of the event rather than the tree's mouse-over
-// state: while a capture runs, the tree's mouse-over leaf is not updated.
+// The look follows the tree's mouse-over state rather than the button's
+// rectangle, so that a node lying over part of the button lifts the press.
 bool ButtonInputCapture::DoMouseEvent(const ui::MouseEvent& inEvent) {
   UI_Button* button = Button();
   if (inEvent.IsEndDragEvent(GetInitialMouseEvent())) {
@@ -37,8 +37,7 @@ bool ButtonInputCapture::DoMouseEvent(const ui::MouseEvent& inEvent) {
     return true;
   }
   if (inEvent.IsAction(ui::MouseEvent::kActionMove)) {
-    const bool inside = button->UI_HitTest(inEvent.GetPosition());
-    button->SetDownState(inside ? !mSavedDownState : mSavedDownState);
+    button->SetDownState(button->UI_IsMouseOver(false) ? !mSavedDownState : mSavedDownState);
     return true;
   }
   return false;

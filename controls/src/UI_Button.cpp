@@ -68,7 +68,7 @@ void UI_Button::SendButtonChangedMessage(ModKeys inModKeys) {
 
 bool UI_Button::IsButtonCaptured() const {
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
-  return manager && dynamic_cast<const ButtonInputCapture*>(manager->GetInputCapture().get()) != nullptr;
+  return manager && dynamic_cast<const ButtonInputCapture*>(manager->GetActiveInputCapture(nullptr)) != nullptr;
 }
 
 // ---- mouse ----
@@ -92,7 +92,7 @@ bool UI_Button::UI_DoMouseEvent(ui::UI_Node*, const ui::MouseEvent& inEvent) {
     return true;
   }
   if (inEvent.IsAction(ui::MouseEvent::kActionButtonUp) && inEvent.IsButton(ui::MouseEvent::kButtonLeft) &&
-      mNotificationOnMouseUp && !(manager && manager->HasInputCapture())) {
+      mNotificationOnMouseUp && !(manager && manager->GetActiveInputCapture(nullptr))) {
     PerformAction(false, inEvent.GetModKey(), false);
     return true;
   }

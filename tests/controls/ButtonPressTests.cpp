@@ -49,6 +49,15 @@ TEST_F(ButtonPressTest, DraggingOffRestoresTheLookAndDraggingBackPressesAgain) {
   EXPECT_TRUE(button->GetDownState());
 }
 
+TEST_F(ButtonPressTest, ANodeCoveringPartOfTheButtonLiftsThePressLook) {
+  Add(new UI_Button, RectF(60, 10, 30, 24));
+  Press(PointF(20, 20));
+  Drag(PointF(70, 20));
+  EXPECT_FALSE(button->GetDownState()) << "inside the rectangle, but the cover is under the pointer";
+  Drag(PointF(30, 20));
+  EXPECT_TRUE(button->GetDownState());
+}
+
 TEST_F(ButtonPressTest, ReleasingOutsideCancelsAndSendsNoChangedMessage) {
   log.Listen(*button);
   Press(PointF(20, 20));
@@ -108,11 +117,19 @@ TEST_F(ButtonPressTest, NotificationOnMouseDownActsAtThePressWithoutCapture) {
   EXPECT_THAT(log.entries, ElementsAre("changed"));
 }
 
-TEST_F(ButtonPressTest, NotificationOnMouseUpPerformsOnABareRelease) {
+TEST_F(ButtonPressTest, NotificationOnMouseUpPerformsOnABareReleaseAlsoWhileACancelledCaptureIsStored) {
   button->SetNotificationOnMouseUp(true);
   log.ListenChanged(*button);
   Release(PointF(20, 20));
   EXPECT_THAT(log.entries, ElementsAre("changed"));
+  auto other = Add(new UI_Button, RectF(100, 100, 40, 20));
+  Press(PointF(110, 110));
+  ASSERT_TRUE(other->IsButtonCaptured());
+  manager.GetInputCapture()->Cancel();
+  EXPECT_FALSE(other->IsButtonCaptured()) << "a cancelled capture is stored but not active";
+  Release(PointF(20, 20));
+  EXPECT_THAT(log.entries, ElementsAre("changed", "changed"));
+  manager.EndInputCapture(true);
 }
 
 TEST_F(ButtonPressTest, AButtonWithoutInteractiveListenersInstallsNoRepeatTimer) {

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include "support/ui/DispatchTestNodes.h"
+#include "ui/HeadlessWindowSystem.h"
 
 namespace norvik::ui::test {
 namespace {
@@ -134,7 +135,9 @@ TEST_F(CursorDispatchTest, AHandlerThatDeletesItsOwnBranchLeavesTheRestOfTheWalk
 
 TEST_F(CursorDispatchTest, AModifierChangeSeenByTheManagerRefreshesTheCursorUnderTheMouse) {
   root->UI_UpdateMouseOverState(MouseAt(MouseEvent::kActionMouseOver, PointF(35, 35), 0, 0));
-  manager.SetGlobalMousePosition(tarsel::geom::PointT<long>(36, 37));
+  HeadlessWindowSystem system;
+  system.Install();
+  system.MovePointer(OS_Point(36, 37));
   log.Clear();
   EXPECT_FALSE(manager.DispatchPreKeyboardEvent(nullptr, KeyDownEvent(16, 0, ModifierKeys(kModKeyShift))));
   EXPECT_THAT(log.Texts("cursor"), ElementsAre("button.cursor(button)", "panel.cursor(button)", "root.cursor(button)"));

@@ -91,6 +91,29 @@ TEST_F(NativeWindowMessageTest, AWindowDestroyedFromOutsideLeavesANodeWithoutAHa
   EXPECT_TRUE(window->UI_GetLocalRect().IsEmpty());
 }
 
+TEST_F(NativeWindowMessageTest, ADestroyedWindowLeavesNoFocusHoverOrFilterPointingIntoItsTree) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 200, 200));
+  InputRecorderViewP leaf;
+  {
+    auto panel = AddView(window.get(), "panel", 0, 0, 200, 200);
+    leaf = AddView(panel.get(), "leaf", 10, 10, 50, 50);
+  }
+  leaf->wantsFocus = true;
+  mSystem.MovePointer(OS_Point(20, 20));
+  mSystem.Pump();
+  ASSERT_EQ(mManager.GetMouseOverLeafNode(), leaf.get());
+  ASSERT_TRUE(leaf->UI_GainKeyboardFocus(kFocusChangeMouse));
+  mManager.AddMouseEventFilterNode(leaf.get());
+  mManager.AddKeyboardEventFilterNode(leaf.get());
+  window.reset();
+  EXPECT_EQ(mManager.GetKeyboardFocusLeafNode(), nullptr);
+  EXPECT_EQ(mManager.GetPreviousKeyboardFocusLeafNode(), nullptr);
+  EXPECT_EQ(mManager.GetMouseOverLeafNode(), nullptr);
+  EXPECT_EQ(mManager.GetMouseOverRootNode(), nullptr);
+  EXPECT_EQ(mManager.GetMouseEventFiltersSize() + mManager.GetKeyboardEventFiltersSize(), 0u)
+      << "a node kept alive outside the window no longer filters events";
+}
+
 // ---- cursor ----
 
 TEST_F(NativeWindowMessageTest, WithAModalWindowUpTheCursorOverAnotherWindowStaysThePlatforms) {
@@ -130,6 +153,22 @@ TEST_F(NativeWindowMessageTest, WithoutAModalWindowTheViewUnderThePointerChooses
   EXPECT_EQ(asked, 1);
 }
 
+TEST_F(NativeWindowMessageTest, AModifierChangeAsksForTheCursorWhereThePointerReallyIs) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 200, 200));
+  auto view = AddView(window.get(), "view", 0, 0, 200, 200);
+  std::vector<UI_Node::PointF> asked;
+  using CursorFn = boost::function<bool(UI_Node*, UI_Node::PointF const&, UI_Node::ModKeys, bool&)>;
+  view->UI_SetCustomDoCursorFunction(boost::make_shared<CursorFn>(
+      [&](UI_Node*, UI_Node::PointF const& inPoint, UI_Node::ModKeys, bool&) { return asked.push_back(inPoint), true; }));
+  mSystem.MovePointer(OS_Point(50, 50));
+  mSystem.Pump();
+  mSystem.MovePointer(OS_Point(60, 70));  // not yet pumped: only the native layer knows
+  asked.clear();
+  ASSERT_EQ(mManager.GetMouseOverRootNode(), window.get());
+  mManager.DispatchCursorToMouseOverRootNode(UI_Node::ModKeys(kModKeyShift));
+  EXPECT_EQ(asked, std::vector<UI_Node::PointF>{UI_Node::PointF(60, 70)});
+}
+
 // ---- activation and focus ----
 
 TEST_F(NativeWindowMessageTest, ActivationKeepsFocusOnTheViewInsideTheWindow) {
@@ -145,6 +184,20 @@ TEST_F(NativeWindowMessageTest, ActivationKeepsFocusOnTheViewInsideTheWindow) {
   mSystem.Pump();
   EXPECT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), field.get());
   EXPECT_EQ(mLayer.GetActiveWindow(), window->GetHandle());
+}
+
+TEST_F(NativeWindowMessageTest, EndingAModalWindowActivatesTheModalWindowBeneath) {
+  auto lower = MakeTopLevel(OS_Rect(0, 0, 200, 200));
+  auto upper = MakeTopLevel(OS_Rect(300, 0, 200, 200));
+  UI_NodeManager::SetModalWindow lowerScope(&mManager, lower.get());
+  {
+    UI_NodeManager::SetModalWindow upperScope(&mManager, upper.get());
+    upper->UI_Activate();
+    mSystem.Pump();
+    ASSERT_EQ(mLayer.GetActiveWindow(), upper->GetHandle());
+  }
+  mSystem.Pump();
+  EXPECT_EQ(mLayer.GetActiveWindow(), lower->GetHandle());
 }
 
 // ---- keyboard ----

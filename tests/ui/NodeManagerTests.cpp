@@ -442,8 +442,11 @@ TEST_F(ManagerSeams, TheTipForDisplayClimbsToAnAncestorThatShowsTipsForItsChildr
   EXPECT_EQ(UI_Node::UI_GetToolTipForDisplay(leaf.get()), leaf.get());
   EXPECT_EQ(UI_Node::UI_GetToolTipForDisplay(nullptr), nullptr);
   std::vector<std::string> log;
-  manager.BeginInputCapture(new RecordingCapture(&log));
+  InputCaptureP capture(new RecordingCapture(&log));
+  manager.BeginInputCapture(capture);
   EXPECT_EQ(UI_Node::UI_GetToolTipForDisplay(leaf.get()), nullptr);
+  capture->Cancel();
+  EXPECT_EQ(UI_Node::UI_GetToolTipForDisplay(leaf.get()), leaf.get()) << "a cancelled capture is no longer active";
   manager.EndInputCapture(true);
 }
 

@@ -2,6 +2,7 @@
 #include <boost/function/function_base.hpp>
 #include <gtest/gtest.h>
 
+#include "support/ui/FocusTestNodes.h"
 #include "support/ui/NodeTestSupport.h"
 
 namespace norvik::ui::test {
@@ -70,13 +71,16 @@ TEST_F(DisablePropagation, AChildAddedUnderADisabledParentInheritsAndLosesItWhen
   EXPECT_TRUE(lateChild->UI_IsEnabled());
 }
 
-TEST_F(DisablePropagation, DisablingTheFocusedNodeHandsFocusToItsParent) {
-  mid->wantsFocus = true;
-  leaf->wantsFocus = true;
-  ASSERT_TRUE(leaf->UI_GainKeyboardFocus(kFocusChangeMouse));
-  leaf->UI_SetDisabled(true);
-  EXPECT_EQ(manager.GetKeyboardFocusLeafNode(), mid.get());
-  EXPECT_FALSE(leaf->UI_HasKeyboardFocus(false));
+TEST_F(DisablePropagation, DisablingTheFocusedNodeAdvancesFocusAndClimbsOnlyWhenNothingTakesIt) {
+  boost::intrusive_ptr<TestWindowNode> window(new TestWindowNode);
+  FocusableViewP panel = AddView(*window, "panel");
+  FocusableViewP first = AddView(*panel, "first");
+  FocusableViewP next = AddView(*panel, "next");
+  ASSERT_TRUE(first->UI_GainKeyboardFocus(kFocusChangeMouse));
+  first->UI_SetDisabled(true);
+  EXPECT_EQ(FocusLeafID(), "next") << "the next node in tab order takes focus";
+  next->UI_SetSelfDisabled(true);
+  EXPECT_EQ(FocusLeafID(), "panel") << "with no enabled sibling left, focus climbs";
 }
 
 // ---------------------------------------------------------------------------

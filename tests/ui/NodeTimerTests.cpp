@@ -282,6 +282,17 @@ TEST_F(ToolTipTimerTest, NothingShowsWhenTheMouseHasMovedToANodeWithAnotherTip) 
   EXPECT_EQ(mWindow->Timers().GetTimerCount(), 0u);
 }
 
+TEST_F(ToolTipTimerTest, TheMouseArrivingOnANodeWithATipShowsItOnlyWhenTheDelayRunsOut) {
+  FocusableViewP other = AddView(*mWindow, "other");
+  other->UI_SetToolTip(u"Pan", 0);
+  mTips->calls.clear();
+  other->UI_SetMouseOverLeafNode(nullptr);
+  EXPECT_EQ(mTips->shown, nullptr);
+  ASSERT_EQ(other->UI_GetTimerIDs().size(), 1u);
+  mWindow->UI_DispatchPossibleTimer(other->UI_GetTimerIDs().front());
+  EXPECT_EQ(mTips->shown, other.get());
+}
+
 TEST_F(ToolTipTimerTest, TheTipTimerNeverReachesTheNodesNotifications) {
   int calls = 0;
   mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++calls; return true; }));

@@ -70,17 +70,16 @@ TEST_F(KeyFocusLockTest, FocusThatNeverMovedIsLeftAloneAndNobodyIsTold) {
   EXPECT_TRUE(mLog.empty());
 }
 
-TEST_F(KeyFocusLockTest, ANodeThatLeftItsWindowDoesNotTakeFocusBack) {
+TEST_F(KeyFocusLockTest, ANodeMovedToAnotherWindowStillTakesFocusBack) {
+  boost::intrusive_ptr<ui::test::TestWindowNode> other(new ui::test::TestWindowNode);
   mA->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  ui::UI_Node* raw = mA.get();
   {
     KeyFocusLock lock;
-    mWindow->ChildRemove(raw);
-    mA.reset();
-    EXPECT_EQ(lock.GetLockedNode(), raw);
+    ui::UI_NodeP keep = mWindow->ChildRemove(mA.get());
+    ASSERT_EQ(FocusLeafID(), "window") << "removal hands focus to the old window";
+    other->ChildPushBack(keep);
   }
-  // Removal handed focus to the window, and there it stays.
-  EXPECT_EQ(FocusLeafID(), "window");
+  EXPECT_EQ(FocusLeafID(), "a");
 }
 
 }  // namespace

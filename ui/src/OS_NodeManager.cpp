@@ -3,6 +3,7 @@
 #include "drawbot/SupplierInterface.h"
 #include "ui/DrawbotImageResourceCache.h"
 #include "ui/ModuleResourceManager.h"
+#include "ui/OS_Window.h"
 
 namespace norvik::ui {
 
@@ -19,6 +20,10 @@ OS_NodeManager::OS_NodeManager() {
   SetResourceManager(NewModuleResourceManager());
   SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
   SetOSDrawSupplier(SharePlatformSupplier());
+}
+
+tarsel::geom::PointT<long> OS_NodeManager::GetGlobalMousePosition() const {
+  return OS_Window::GetGlobalMousePosition();
 }
 
 }  // namespace norvik::ui

@@ -58,6 +58,13 @@ OS_Window::OS_Window()
   UI_SetNodeID("OS_Window");
 }
 
+namespace {
+void ForgetTree(UI_NodeManager& ioManager, UI_Node& inNode) {
+  ioManager.ForgetNode(&inNode);
+  for (auto it = inNode.ChildBegin(); it != inNode.ChildEnd(); ++it) ForgetTree(ioManager, **it);
+}
+}  // namespace
+
 OS_Window::~OS_Window() {
   // Tearing the tree down calls out (focus hand-over, native destroy
   // messages) and callees take strong references; with the count at 0 their
@@ -66,8 +73,9 @@ OS_Window::~OS_Window() {
   if (GetRefCount() == 0) AddRef();
   UI_RemoveAllTimers();
   // A window going away takes every cached pointer into its tree with it:
-  // removing the children must not hand focus or hover to this dying node.
-  if (UI_NodeManager* manager = UI_NodeManager::Get()) manager->ReplaceInAllCachedNodes(this, nullptr, true);
+  // removing the children must not hand focus or hover to this dying node,
+  // and a node of the tree that outlives it must not stay a filter.
+  if (UI_NodeManager* manager = UI_NodeManager::Get()) ForgetTree(*manager, *this);
   DeleteChildren();
   if (mPlatformWindow != 0) {
     const OS_WindowHandle handle = mPlatformWindow;

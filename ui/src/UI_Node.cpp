@@ -216,7 +216,7 @@ bool UI_Node::UI_PerformUserResizingDraw() {
 UI_Node* UI_Node::UI_GetToolTipForDisplay(UI_Node* inNode) {
   if (!inNode) return nullptr;
   UI_NodeManager* manager = UI_NodeManager::Get();
-  if (manager && manager->HasInputCapture()) return nullptr;
+  if (manager && manager->GetActiveInputCapture(nullptr)) return nullptr;
   if (!inNode->UI_GetToolTip().empty()) return inNode;
   for (UI_Node* p = inNode->UI_GetParentNode(); p; p = p->UI_GetParentNode()) {
     if (!p->UI_GetToolTip().empty() && p->UI_DisplaysToolTipForChild(inNode)) return p;

@@ -6,6 +6,7 @@
 
 #include "tarsel/ThrowError.h"
 #include "ui/UI_Node.h"
+#include "ui/UI_Window.h"
 
 namespace norvik::ui {
 
@@ -190,8 +191,10 @@ void UI_NodeManager::PopModalWindow(UI_Node* inWindow) {
   mModalStack.pop_back();
   ScUpdatingFocus updating(this);
   if (!mModalStack.empty()) {
+    // The native activation, not a node-side notice: the window beneath
+    // must really become the active one again.
     UI_NodeP top(mModalStack.back().first);
-    top->UI_ActivationChanged(UI_Node::kWindowActive);
+    if (auto* window = dynamic_cast<UI_Window*>(top.get())) window->UI_Activate();
   }
   if (entry.second) {
     UI_NodeP saved(entry.second);

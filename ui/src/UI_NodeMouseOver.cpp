@@ -12,6 +12,8 @@
 #include "ui/MouseEvent.h"
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
+#include "ui/UI_SuspendToolTips.h"
+#include "ui/UI_ToolTipManager.h"
 
 namespace norvik::ui {
 namespace {
@@ -24,15 +26,22 @@ UI_Node::NodeChain StrongChain(UI_Node* inNode) {
   return chain;
 }
 
-// The tip of the new leaf, or none.
+// The tip for the new leaf. A node's own tip waits for the display delay
+// before it shows; a tip already on screen for this node, or one that an
+// ancestor shows for it, follows the mouse at once.
 void UpdateToolTipsAfterMouseOverChange(UI_NodeManager* inManager, UI_Node* inLeaf) {
   UI_ToolTipManager* tips = inManager->GetToolTipManager();
   if (!tips) return;
   UI_Node* display = inLeaf ? UI_Node::UI_GetToolTipForDisplay(inLeaf) : nullptr;
-  if (display)
-    tips->RefreshToolTip(display);
-  else
+  if (!display || UI_SuspendToolTips::IsSuspended()) {
     tips->DisposeToolTip();
+  } else if (display == inLeaf && tips->GetToolTipNode() != inLeaf) {
+    tips->DisposeToolTip();
+    UI_NodeP protect(inLeaf);
+    inLeaf->UI_InstallTimer(tips->GetDisplayDelay(), UI_NodeManager::GetTooltipTimerID());
+  } else {
+    tips->RefreshToolTip(display);
+  }
 }
 
 }  // namespace

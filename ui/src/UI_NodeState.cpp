@@ -9,9 +9,13 @@ void UI_Node::UI_SetSelfDisabled(bool inDisable) {
   UI_NodeProtector protect(this);
   if (inDisable) {
     mStateFlags.Set(kStateSelfDisabled);
-    // A disabled node may not keep focus. Focus advance to a sibling is not
-    // offered from here; focus climbs to the nearest ancestor that takes it.
-    if (UI_HasKeyboardFocus(false)) UI_LoseKeyboardFocus();
+    // A disabled node may not keep focus: it goes on to the next node in tab
+    // order, and only when nothing takes it does it climb to an ancestor.
+    if (UI_HasKeyboardFocus(false)) {
+      UI_Container* parent = UI_GetParentContainer();
+      if (parent) UI_AdvanceFocus(true, mIndex, parent);
+      if (!parent || UI_HasKeyboardFocus(false)) UI_LoseKeyboardFocus();
+    }
   } else {
     mStateFlags.Clear(kStateSelfDisabled);
   }

@@ -47,6 +47,9 @@ ControlTest::~ControlTest() {
 }
 
 bool ControlTest::Mouse(ui::MouseEvent::Action inAction, const PointF& inPoint, ModKeys inMods) {
+  // As a native window does, every move first updates the mouse-over state.
+  if (inAction == ui::MouseEvent::kActionMove)
+    root->UI_UpdateMouseOverState(ui::test::MouseAt(ui::MouseEvent::kActionMouseOver, inPoint, 0, 0, inMods));
   return root->UI_DispatchMouseEvent(ui::test::MouseAt(inAction, inPoint, ui::MouseEvent::kButtonLeft, 1, inMods),
                                      true);
 }
