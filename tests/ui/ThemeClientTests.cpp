@@ -134,13 +134,18 @@ TEST_F(ThemeClientTest, AClientOnAnOwnersSharedSupplierFollowsTheOwnersName) {
   EXPECT_EQ(client.UI_GetCurrentTheme(), studio);
 }
 
-TEST_F(ThemeClientTest, ASharedSupplierOutlivingItsOwnerAnswersNull) {
+TEST_F(ThemeClientTest, AClientWhoseOwnerIsGoneOrWhoseSupplierGivesNothingReadsTheDefaultTheme) {
   CountingClient client;
   {
     ThemeOwner owner;
     client.UI_SetThemeSupplier(owner.GetSharedThemeSupplier());
   }
-  EXPECT_FALSE(client.UI_GetCurrentTheme());
+  const ThemeP fallback = Theme::GetTheme(GetDefaultThemeName());
+  EXPECT_EQ(client.UI_GetCurrentTheme(), fallback);
+  client.UI_SetThemeSupplier(SupplierOf(nullptr));
+  EXPECT_EQ(client.GetThemeColor(19), fallback->GetColor(19));
+  EXPECT_EQ(client.GetThemeFontSize(0), fallback->GetFontSize(0));
+  EXPECT_EQ(client.GetThemeFontName(0), fallback->GetFontName(0));
 }
 
 }  // namespace

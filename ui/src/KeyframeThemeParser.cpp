@@ -1,6 +1,7 @@
 #include "ui/KeyframeThemeParser.h"
 
 #include <cmath>
+#include <type_traits>
 
 #include "tarsel/StringStreams.h"
 #include "tarsel/ThrowError.h"
@@ -9,47 +10,32 @@ namespace norvik::ui {
 
 namespace {
 
-[[noreturn]] void RaiseBadNumber(std::string_view inElement, std::string_view inAttribute,
-                                 const UTF8String& inText) {
-  tarsel::config::ThrowError(
-      tarsel::config::ErrorLevel::kError,
-      "$$$/norvik/ui/Error/ThemeKeyframeNumber=The attribute \"^0\" of \"^1\" is not a valid number: \"^2\".", 0, 0,
-      false, inAttribute, inElement, inText);
-}
-
-// Reads the whole text as one number; blanks around it are allowed.
+// Numbers read as the string stream reads them. An attribute that is absent,
+// or whose text gives no number, answers false and leaves its element out.
 template <typename T>
-bool ReadWhole(const UTF8String& inText, T& outValue) {
-  tarsel::iUTF16StringStream in(tarsel::utility::UTF8to16(inText));
-  in >> outValue;
+bool ReadNumber(const tarsel::xml::Attributes& inAttributes, std::string_view inName, T& outValue) {
+  const UTF8String* text = inAttributes.Find(inName);
+  if (!text) return false;
+  tarsel::iUTF16StringStream in(tarsel::utility::UTF8to16(*text));
+  T value{};
+  in >> value;
   if (in.fail()) return false;
-  in >> std::ws;
-  return in.eof();
-}
-
-// An absent attribute answers false; a present one that does not read raises.
-bool ReadFloat(const tarsel::xml::Attributes& inAttributes, std::string_view inElement, std::string_view inName,
-               float& outValue) {
-  const UTF8String* text = inAttributes.Find(inName);
-  if (!text) return false;
-  if (!ReadWhole(*text, outValue) || !std::isfinite(outValue)) RaiseBadNumber(inElement, inName, *text);
-  return true;
-}
-
-bool ReadIdentifier(const tarsel::xml::Attributes& inAttributes, std::string_view inElement,
-                    std::string_view inName, std::uint64_t& outValue) {
-  const UTF8String* text = inAttributes.Find(inName);
-  if (!text) return false;
-  // The stream would wrap a minus sign into a huge value.
-  unsigned long long value = 0;
-  if (text->find('-') != UTF8String::npos || !ReadWhole(*text, value)) RaiseBadNumber(inElement, inName, *text);
+  if constexpr (std::is_floating_point_v<T>) {
+    if (!std::isfinite(value)) return false;
+  }
   outValue = value;
   return true;
 }
 
-[[noreturn]] void RaiseUnknown(std::string_view inKeyText, std::uint64_t inID) {
-  tarsel::config::ThrowError(tarsel::config::ErrorLevel::kError, inKeyText, 0, 0, false,
-                             static_cast<long long>(inID));
+bool ReadFloat(const tarsel::xml::Attributes& inAttributes, std::string_view inName, float& outValue) {
+  return ReadNumber(inAttributes, inName, outValue);
+}
+
+bool ReadIdentifier(const tarsel::xml::Attributes& inAttributes, std::string_view inName, std::uint64_t& outValue) {
+  unsigned long long value = 0;
+  if (!ReadNumber(inAttributes, inName, value)) return false;
+  outValue = value;
+  return true;
 }
 
 [[noreturn]] void RaiseIncomplete(std::string_view inElement) {
@@ -80,12 +66,10 @@ void KeyframeThemeParser::StartElement(std::string_view inName, const tarsel::xm
   } else if (inName == "FontSize") {
     ReadFontSize(inAttributes);
   } else if (inName == "Theme") {
-    // A group without "t" is no group: its key frames carry their own t.
-    float t = 0;
-    if (ReadFloat(inAttributes, inName, "t", t)) {
-      mInThemeGroup = true;
-      mGroupT = t;
-    }
+    // "t" is optional: a group without it still groups, at t 0.
+    mInThemeGroup = true;
+    mGroupT = 0;
+    ReadFloat(inAttributes, "t", mGroupT);
   }
   // "ThemeColors" and "ThemeFonts" only frame the content; other elements are ignored.
 }
@@ -102,22 +86,17 @@ void KeyframeThemeParser::ReadKeyFrame(const tarsel::xml::Attributes& inAttribut
   std::uint64_t id = 0;
   float t = mGroupT;
   KeyValue value(0, 0, 0, 1, false);
-  bool complete = ReadIdentifier(inAttributes, element, "name", id);
-  if (!mInThemeGroup) complete = ReadFloat(inAttributes, element, "t", t) && complete;
-  complete = ReadFloat(inAttributes, element, "v", value.mValue) && complete;
-  ReadFloat(inAttributes, element, "h", value.mHue);
-  ReadFloat(inAttributes, element, "s", value.mSaturation);
-  ReadFloat(inAttributes, element, "a", value.mAlpha);
+  bool complete = ReadIdentifier(inAttributes, "name", id);
+  if (!mInThemeGroup) complete = ReadFloat(inAttributes, "t", t) && complete;
+  complete = ReadFloat(inAttributes, "v", value.mValue) && complete;
+  ReadFloat(inAttributes, "h", value.mHue);
+  ReadFloat(inAttributes, "s", value.mSaturation);
+  ReadFloat(inAttributes, "a", value.mAlpha);
   const UTF8String* hold = inAttributes.Find("hold");
   value.mHold = hold && *hold == "true";
   if (!complete) {
     if (mEditor->GetStrictMode()) RaiseIncomplete(element);
     return;
-  }
-  if (id >= mEditor->GetColorCount()) {
-    RaiseUnknown("$$$/norvik/ui/Error/ThemeKeyframeUnknownColor=The key frame names colour ^0, which the theme "
-                 "does not have.",
-                 id);
   }
   if (mSeenColors.insert(id).second) mEditor->ClearColorKeyValue(id);
   mEditor->SetColorKeyValue(id, t, value);
@@ -127,17 +106,12 @@ void KeyframeThemeParser::ReadFontSize(const tarsel::xml::Attributes& inAttribut
   const std::string_view element = "FontSize";
   std::uint64_t id = 0, scheme = 0;
   float size = 0;
-  bool complete = ReadIdentifier(inAttributes, element, "name", id);
-  complete = ReadFloat(inAttributes, element, "size", size) && complete;
-  complete = ReadIdentifier(inAttributes, element, "scheme", scheme) && complete;
+  bool complete = ReadIdentifier(inAttributes, "name", id);
+  complete = ReadFloat(inAttributes, "size", size) && complete;
+  complete = ReadIdentifier(inAttributes, "scheme", scheme) && complete;
   if (!complete) {
     if (mEditor->GetStrictMode()) RaiseIncomplete(element);
     return;
-  }
-  if (id >= mEditor->GetFontCount()) {
-    RaiseUnknown("$$$/norvik/ui/Error/ThemeKeyframeUnknownFont=The font size names font ^0, which the theme "
-                 "does not have.",
-                 id);
   }
   mEditor->SetFontSizeSchemeValue(id, scheme, size);
 }

@@ -48,16 +48,22 @@ void ThemeClient::ClearCustomFontSize(std::uint64_t inID) {
   UI_ThemeUpdated(1);
 }
 
+namespace {
+// A supplier that gives no theme leaves the client on the default one, so
+// that reading an entry never goes through a null theme.
+ThemeP OrDefault(ThemeP inTheme) { return inTheme ? inTheme : Theme::GetTheme(GetDefaultThemeName()); }
+}  // namespace
+
 drawbot::ColorRGBA ThemeClient::GetThemeColor(std::uint64_t inID) const {
   if (mCustom) {
     auto it = mCustom->colors.find(inID);
     if (it != mCustom->colors.end()) return it->second;
   }
-  return UI_GetCurrentTheme()->GetColor(inID);
+  return OrDefault(UI_GetCurrentTheme())->GetColor(inID);
 }
 
 UTF16String ThemeClient::GetThemeFontName(std::uint64_t inID) const {
-  return UI_GetCurrentTheme()->GetFontName(inID);
+  return OrDefault(UI_GetCurrentTheme())->GetFontName(inID);
 }
 
 float ThemeClient::GetThemeFontSize(std::uint64_t inID) const {
@@ -65,7 +71,7 @@ float ThemeClient::GetThemeFontSize(std::uint64_t inID) const {
     auto it = mCustom->fontSizes.find(inID);
     if (it != mCustom->fontSizes.end()) return it->second;
   }
-  return UI_GetCurrentTheme()->GetFontSize(inID);
+  return OrDefault(UI_GetCurrentTheme())->GetFontSize(inID);
 }
 
 void ThemeClient::UI_ResetThemeSupplier() {

@@ -10,8 +10,10 @@ ThemeOwner::ThemeOwner()
 
 ThemeOwner::~ThemeOwner() {
   // Clients may still hold the shared supplier; after this owner is gone it
-  // must not call back into it.
-  if (mSharedSupplier) *mSharedSupplier = boost::function<ThemeP()>([] { return ThemeP(); });
+  // must not call back into it, and it answers what an owner of an unknown
+  // name answers: the default theme.
+  if (mSharedSupplier)
+    *mSharedSupplier = boost::function<ThemeP()>([] { return Theme::GetTheme(GetDefaultThemeName()); });
 }
 
 void ThemeOwner::SetThemeName(const UTF16String& inName, bool) {
