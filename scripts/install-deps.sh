@@ -15,6 +15,7 @@ PACKAGES=(
   libx11-dev libgl-dev libglx-dev mesa-common-dev libgl1-mesa-dri
   libgtest-dev libgmock-dev googletest libbenchmark-dev
   xvfb xdotool xclip x11-utils x11-xkb-utils
+  gcovr
 )
 
 SUDO=""
