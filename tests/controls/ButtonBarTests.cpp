@@ -10,17 +10,15 @@
 #include "drawbot/Drawbot.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/controls/ControlTestSupport.h"
+#include "support/ui/KeyCodes.h"
 
 namespace norvik::controls::test {
 namespace {
 
+using namespace ui::test::keys;
+
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
-
-constexpr short kLeft = 37;
-constexpr short kUp = 38;
-constexpr short kRight = 39;
-constexpr short kDown = 40;
 
 class ButtonBarTest : public ControlTest {
  protected:
@@ -267,11 +265,6 @@ TEST_F(ButtonBarTest, AListenerMayDeleteTheBar) {
 }
 
 // ---- keyboard ----
-
-TEST_F(ButtonBarTest, AClickHandsFocusToTheBar) {
-  Click(1);
-  EXPECT_EQ(ui::UI_Node::UI_GetKeyboardFocusLeafNode(), bar.get());
-}
 
 TEST_F(ButtonBarTest, ArrowsMoveTheSelectionLikeClicks) {
   Click(0);

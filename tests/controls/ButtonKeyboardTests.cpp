@@ -6,17 +6,16 @@
 
 #include "controls/UI_Button.h"
 #include "support/controls/ControlTestSupport.h"
+#include "support/ui/KeyCodes.h"
 #include "ui/CustomSettingsManager.h"
 
 namespace norvik::controls::test {
 namespace {
 
+using namespace ui::test::keys;
+
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
-
-constexpr short kSpace = 32;
-constexpr short kReturn = 13;
-constexpr short kEscape = 27;
 
 class ButtonKeyboardTest : public ControlTest {
  protected:
@@ -103,15 +102,6 @@ TEST_F(ButtonKeyboardTest, AListenerThatThrowsOnKeyUpReachesTheCallerAndTheChang
   EXPECT_THROW(KeyUp(button.get(), kSpace, ' '), std::runtime_error);
   EXPECT_FALSE(button->IsChangePending());
   EXPECT_THAT(log.entries, ElementsAre("begin", "changed", "cancel"));
-}
-
-TEST_F(ButtonKeyboardTest, ModifierKeysSwapTheToolTip) {
-  button->InsertModifiedToolTip(ModKeys(), u"Play");
-  button->InsertModifiedToolTip(ModKeys(ui::kModKeyShift), u"Play backwards");
-  button->ModKeyChanged(ModKeys(ui::kModKeyShift | ui::kModKeyCapsLock));
-  EXPECT_EQ(button->UI_GetToolTip(), UTF16String(u"Play backwards"));
-  button->ModKeyChanged(ModKeys());
-  EXPECT_EQ(button->UI_GetToolTip(), UTF16String(u"Play"));
 }
 
 }  // namespace

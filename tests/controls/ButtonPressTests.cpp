@@ -132,14 +132,6 @@ TEST_F(ButtonPressTest, NotificationOnMouseUpPerformsOnABareReleaseAlsoWhileACan
   manager.EndInputCapture(true);
 }
 
-TEST_F(ButtonPressTest, AButtonWithoutInteractiveListenersInstallsNoRepeatTimer) {
-  log.ListenChanged(*button);
-  Press(PointF(20, 20));
-  EXPECT_TRUE(button->UI_GetTimerIDs().empty());
-  Release(PointF(20, 20));
-  EXPECT_THAT(log.entries, ElementsAre("changed"));
-}
-
 TEST_F(ButtonPressTest, AHeldButtonRepeatsOnlyAfterAQuarterSecondAndSkipsTheReleaseContinue) {
   log.Listen(*button);
   Press(PointF(20, 20));
@@ -208,14 +200,6 @@ TEST_F(ButtonPressTest, HoverListenersHearMovesButNotPresses) {
   Drag(PointF(20, 20));
   Press(PointF(20, 20));
   EXPECT_EQ(hovers, 1);
-}
-
-TEST_F(ButtonPressTest, ADisabledButtonTakesNoHoverMessage) {
-  int hovers = 0;
-  button->NotifyHover(ui::MakeNotification<void(UI_HoverMessage*)>([&](UI_HoverMessage*) { ++hovers; }));
-  button->SetEnabled(false);
-  Drag(PointF(20, 20));
-  EXPECT_EQ(hovers, 0);
 }
 
 }  // namespace

@@ -29,13 +29,6 @@ TEST_F(ControlBaseTest, ANewControlIsUnknownAndSettingUnknownAgainDoesNothing) {
   EXPECT_EQ(calls, 2);
 }
 
-TEST_F(ControlBaseTest, AButtonIsBornKnownAndOff) {
-  UI_ButtonP button(new UI_Button);
-  EXPECT_TRUE(button->IsValueKnown());
-  EXPECT_EQ(button->GetValue(), UI_Button::kButtonOff);
-  EXPECT_EQ(button->UI_GetNodeID(), UTF8String("UI_Button"));
-}
-
 TEST_F(ControlBaseTest, StateBitsReflectDownDisabledAndFocus) {
   auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
   control->SetDownState(true);
@@ -92,13 +85,6 @@ TEST_F(ControlBaseTest, ADoubledAmpersandIsALiteralAndNoMnemonic) {
   EXPECT_FALSE(control->UI_ProcessStringAndSetMnemonic(u"Salt && Pepper", out));
   EXPECT_EQ(out, UTF16String(u"Salt & Pepper"));
   EXPECT_FALSE(control->GetMnemonicKey().IsValid());
-}
-
-TEST_F(ControlBaseTest, WithoutMnemonicsAllowedTheTextStaysAsItIs) {
-  auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
-  UTF16String out;
-  EXPECT_FALSE(control->UI_ProcessStringAndSetMnemonic(u"Op&en", out));
-  EXPECT_EQ(out, UTF16String(u"Op&en"));
 }
 
 TEST_F(ControlBaseTest, AltWithTheMnemonicLetterFocusesAndPressesTheButton) {

@@ -127,13 +127,6 @@ TEST_F(ToggleButtonTest, ATextButtonIsMeasuredWithoutASupplierInTheManager) {
   EXPECT_EQ(empty->UI_GetRecommendedSize().x, 0);
 }
 
-TEST_F(ToggleButtonTest, ATextButtonShowsItsLabelWithoutTheMnemonicMarker) {
-  manager.EnableMnemonics();
-  UI_TextButtonP button(new UI_TextButton(u"&Render"));
-  EXPECT_EQ(button->GetText(), UTF16String(u"Render"));
-  EXPECT_EQ(button->GetMnemonicLocation(), 0);
-}
-
 TEST_F(ToggleButtonTest, ModifiedNamesSwapTheLabelWhileTheKeysAreHeld) {
   UI_TextButtonP button(new UI_TextButton(u"Delete"));
   button->InsertModifiedName(ModKeys(ui::kModKeyAlt), u"Delete All");
