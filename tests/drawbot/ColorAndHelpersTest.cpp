@@ -38,11 +38,6 @@ TEST(HSB, PrimaryAndGreyColoursConvertBothWays) {
   EXPECT_DOUBLE_EQ(b, 1);
 }
 
-TEST(HSB, ANegativeHueEqualsItsPositiveTwin) {
-  EXPECT_EQ(HSBtoRGB<float>(-30, 0.8f, 0.9f, 1), HSBtoRGB<float>(330, 0.8f, 0.9f, 1));
-  EXPECT_EQ(HSBtoRGB<float>(390, 0.8f, 0.9f, 1), HSBtoRGB<float>(30, 0.8f, 0.9f, 1));
-}
-
 TEST(HSB, RoundTripsThroughEverySector) {
   for (float hue = 5; hue < 360; hue += 37) {
     ColorRGBA c = HSBtoRGB<double>(hue, 0.6, 0.7, 1);
@@ -288,13 +283,6 @@ TEST(ShapeHelpers, IntegerFormsKeepAPathPixelAlignedAndAnyFloatFormClearsIt) {
   EXPECT_TRUE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
   path->LineTo(PointT<float>(5, 5));
   EXPECT_FALSE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
-}
-
-TEST(FlashDelay, DefaultsToZeroAndKeepsWhatIsSet) {
-  EXPECT_EQ(GetRedrawDebugFlashDelay(), 0u);
-  SetRedrawDebugFlashDelay(30);
-  EXPECT_EQ(GetRedrawDebugFlashDelay(), 30u);
-  SetRedrawDebugFlashDelay(0);
 }
 
 TEST(MemBuffers, RowsAreSixteenByteAlignedAndChannelsSwap) {

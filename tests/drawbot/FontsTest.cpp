@@ -49,11 +49,6 @@ TEST(Fonts, AFamilyThatWouldBeSubstitutedIsRefusedAtCreation) {
   }
 }
 
-TEST(Fonts, TheFamilyIsComparedWithoutRegardToCase) {
-  FontP font(NewOSSupplier(), u"dejavu sans", u"", 12);
-  EXPECT_FALSE(font.IsNull());
-}
-
 TEST(Fonts, TheCacheHandsOutOneFontPerFamilyStyleAndSize) {
   SupplierInterface const* supplier = NewOSSupplier();
   FontP a(supplier, u"DejaVu Sans", u"", 12), b(supplier, u"DejaVu Sans", u"Regular", 12);
@@ -143,14 +138,6 @@ TEST(TextPlacement, TextMatchesItsReferenceImage) {
                       kTextTruncationEndWithEllipsis, 90);
   // The text tests use a tolerance: font hinting differs slightly between FreeType versions.
   EXPECT_TRUE(testing::MatchesReference(canvas.Snapshot(), "drawbot/text", 24));
-}
-
-TEST(Baseline, TheDefaultBaselineDependsOnlyOnTheSize) {
-  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
-  // 12 * 0.9 + 10 + (20 - 12) * 0.5 = 24.8, rounded.
-  EXPECT_EQ(GetFontBaseline(font, RectT<float>(0, 10, 100, 20)), 25);
-  FontP bold(NewOSSupplier(), u"DejaVu Sans", u"Bold", 12);
-  EXPECT_EQ(GetFontBaseline(bold, RectT<float>(0, 10, 100, 20)), 25);
 }
 
 TEST(Baseline, TheSettingMakesTheBaselineFollowAscentAndDescent) {

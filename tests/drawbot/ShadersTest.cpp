@@ -36,13 +36,6 @@ TEST(ShaderStops, StopsAlreadyAtTheEndsAreNotDoubled) {
   EXPECT_EQ(AsRecorded(shader).positions, (std::vector<float>{0, 0.5f, 1}));
 }
 
-TEST(ShaderStops, TheTwoColourFormUsesStopsAtZeroAndOne) {
-  RecordingSupplier supplier;
-  LinearShaderP shader(&supplier, PointT<float>(0, 0), PointT<float>(10, 0), kRed, kBlue);
-  EXPECT_EQ(AsRecorded(shader).positions, (std::vector<float>{0, 1}));
-  EXPECT_EQ(AsRecorded(shader).colors, (std::vector<ColorRGBA>{kRed, kBlue}));
-}
-
 TEST(ShaderPixels, ALinearShaderRunsFromItsStartColourToItsEndColour) {
   PixelCanvas canvas(101, 3);
   LinearShaderP shader(canvas.GetSupplier(), PointT<float>(0, 0), PointT<float>(101, 0),

@@ -19,17 +19,6 @@ using testing::RecordingSupplier;
 
 using norvik::test::ErrorOf;
 
-TEST(StateStack, AFreshSurfaceHasTheDocumentedDefaults) {
-  SurfaceP surface(NewOSSupplier(), 20, 10);
-  EXPECT_EQ(surface->GetAntiAliasPolicy(), kAntiAliasNone);
-  EXPECT_EQ(surface->GetInterpolationPolicy(), kInterpolationNearestNeighbor);
-  EXPECT_EQ(surface->GetTextDisplayPolicy(), kTextDisplayGridFitted);
-  MatrixT<float> m;
-  surface->GetTransform(&m);
-  EXPECT_TRUE(m.IsIdentity());
-  EXPECT_EQ(surface->GetClipBounds(), RectT<long>(0, 0, 20, 10));
-}
-
 TEST(StateStack, PopRestoresPoliciesTransformAndClip) {
   SurfaceP surface(NewOSSupplier(), 50, 50);
   surface->PushStateStack();
@@ -146,14 +135,6 @@ TEST(Wrappers, ANullSupplierLeavesEveryWrapperEmptyWithoutAnError) {
   EXPECT_TRUE(LinearShaderP(nullptr, PointT<float>(), PointT<float>(1, 0), ColorRGBA(), ColorRGBA()).IsNull());
   EXPECT_TRUE(FileImageP(nullptr, kImageFileTypePNG, "missing.png", 0).IsNull());
   EXPECT_TRUE(SurfaceP(nullptr, 10, 10).IsNull());
-}
-
-TEST(Wrappers, CopiesShareOneObject) {
-  PenP pen(NewOSSupplier(), ColorRGBA(), 1);
-  PenP copy = pen;
-  copy->SetWidth(4);
-  EXPECT_EQ(pen->GetWidth(), 4);
-  EXPECT_EQ(pen.Get(), copy.Get());
 }
 
 TEST(Wrappers, AnObjectOfAnotherSupplierRaisesUnspecifiedDrawingError) {

@@ -152,16 +152,6 @@ TEST(WidestLine, AnEmptyTextIsZeroAndTheLongestLineWins) {
   EXPECT_EQ(surface->MeasureMaximumMultiLineStringWidth(*font, u"abcd"), 20);
 }
 
-TEST(WidestLine, RealFontsMeasureLongerLinesWider) {
-  SurfaceP surface(NewOSSupplier(), 10, 10);
-  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
-  float one = surface->MeasureMaximumMultiLineStringWidth(*font, u"Gain");
-  float both = surface->MeasureMaximumMultiLineStringWidth(*font, u"Gain\nGain and Pan");
-  EXPECT_GT(one, 0);
-  EXPECT_GT(both, one);
-  EXPECT_FLOAT_EQ(both, font->MeasureStringWidth(Chars(u"Gain and Pan"), -1));
-}
-
 TEST(TruncationWithRealFonts, TheResultFitsTheWidth) {
   FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
   UTF16String text = u"A rather long clip name for the timeline";

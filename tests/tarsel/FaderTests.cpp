@@ -153,11 +153,3 @@ TEST(FaderTranslator, TheSinglePrecisionLawKeepsTheExactPoints) {
   EXPECT_EQ(law.GetDecibelValue(1.0f), 10.0f);
   EXPECT_EQ(law.GetDecibelValue(0.0f), -std::numeric_limits<float>::infinity());
 }
-
-TEST(FaderTranslator, IsASharedObjectHeldByReference) {
-  boost::intrusive_ptr<Fader> law(new Fader);
-  boost::intrusive_ptr<Fader> second = law;
-  EXPECT_EQ(law->GetRefCount(), 2);
-  second.reset();
-  EXPECT_EQ(law->GetRefCount(), 1);
-}

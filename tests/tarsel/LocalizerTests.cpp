@@ -60,13 +60,6 @@ TEST_F(LocalizerTest, LineEndAndApostropheEscapesExpand) {
   EXPECT_EQ(tarsel::config::Localize("$$$/norvik/x/Esc=Don^}t#{endl}stop"), u"N'arr\u00EAte pas\n!");
 }
 
-TEST_F(LocalizerTest, SlotsOfALocalisedTextAreFilledByReplaceInString) {
-  UTF16String text = tarsel::config::Localize("$$$/norvik/x/Frames=Frame @0 of @1");
-  EXPECT_EQ(ReplaceInString(text, 4, 25), u"Frame 4 of 25");
-  Localizer::Get().SetTranslation("$$$/norvik/x/Frames", u"Bild @0 von @1");
-  EXPECT_EQ(ReplaceInString(tarsel::config::Localize("$$$/norvik/x/Frames=Frame @0 of @1"), 4, 25), u"Bild 4 von 25");
-}
-
 TEST_F(LocalizerTest, TranslationsOverrideDefaultsAndErrorMessages) {
   Localizer::Get().SetTranslation("tarsel/utility/Error/DivisionByZero", u"Division par z\u00E9ro.");
   try {

@@ -20,14 +20,6 @@ TEST(ModuleResourceTests, AnEmbeddedDocumentIsFoundByNameAndType) {
   EXPECT_TRUE(ModuleHasBinary(kThisModule, "ExamplePropList", "XML"));
 }
 
-TEST(ModuleResourceTests, NamesAndTypesCompareWithoutCase) {
-  EXPECT_TRUE(ModuleHasBinary(kThisModule, "exampleproplist", "xml"));
-  EXPECT_TRUE(ModuleHasBinary(kThisModule, "EXAMPLEPROPLIST", "Xml"));
-  EXPECT_FALSE(ModuleHasBinary(kThisModule, "ExamplePropList", "PNG")) << "the type must match too";
-  EXPECT_FALSE(ModuleHasBinary(kThisModule, "ExamplePropLis", "XML")) << "a prefix is not the name";
-  EXPECT_FALSE(ModuleHasBinary(kThisModule, "", ""));
-}
-
 TEST(ModuleResourceTests, AMissingResourceLeavesTheBufferAlone) {
   std::vector<unsigned char> buffer{1, 2, 3};
   EXPECT_FALSE(GetBinaryFromModule(kThisModule, "NoSuchResource", "XML", buffer));

@@ -264,9 +264,3 @@ TEST(LocaleDefault, ScopedReplacementIsRestored) {
   }
   EXPECT_EQ(Locale::Default().GetName(), before);
 }
-
-TEST(LocaleDefault, EnvironmentLocaleHasDistinctMarks) {
-  Locale env = Locale::FromEnvironment();
-  EXPECT_NE(env.GetDecimalMark(), env.GetGroupingMark());
-  EXPECT_FALSE(env.GetName().empty());
-}

@@ -100,11 +100,6 @@ TEST(PropListXmlTests, WritesTheDocumentTextExactly) {
   EXPECT_EQ(expected, Str(utils::WritePropList(list)));
 }
 
-TEST(PropListXmlTests, AnEmptyListIsAMapWithAnEmptyList) {
-  EXPECT_EQ("<?xml version='1.0'?>\r\n<prop.map version='4'>\r\n  <prop.list>\r\n  </prop.list>\r\n</prop.map>\r\n",
-            Str(utils::WritePropList(PropList())));
-}
-
 TEST(PropListXmlTests, FloatsArePrintedWithSixDigitsAndThreeDigitExponents) {
   EXPECT_EQ("300", utils::FormatFloat(300.0f));
   EXPECT_EQ("-1.07374e+008", utils::FormatFloat(-107374182.4f));
@@ -354,19 +349,6 @@ TEST(PropListXmlTests, PointReadsRefuseTheWrongShapeOrType) {
   EXPECT_FALSE(utils::ReadPoint32(list, "missing", p));
   EXPECT_FALSE(utils::ReadRectF32(list, "floats", r));
   EXPECT_EQ(tarsel::geom::PointT<long>(9, 9), p);
-}
-
-TEST(PropListXmlTests, TheCursorDataDocumentReadsAsItIsStored) {
-  const std::string xml =
-      "<?xml version='1.0'?>\r\n<prop.map version='1'>\r\n<prop.list>\r\n"
-      "<prop.pair>\r\n<key>NRK_CursorData</key>\r\n<string>1.0</string>\r\n</prop.pair>\r\n"
-      "<prop.pair>\r\n<key>kHotSpot</key>\r\n<array>\r\n<array.type><int type='signed' size='32'/></array.type>\r\n"
-      "<int type='signed' size='32'>5</int>\r\n<int type='signed' size='32'>6</int>\r\n</array>\r\n</prop.pair>\r\n"
-      "</prop.list>\r\n</prop.map>\r\n";
-  PropList list = Read(xml);
-  tarsel::geom::PointT<long> hot;
-  ASSERT_TRUE(utils::ReadPoint32(list, "kHotSpot", hot));
-  EXPECT_EQ(tarsel::geom::PointT<long>(5, 6), hot);
 }
 
 TEST(PropListXmlTests, SavedFilesLoadBackAndMissingFilesRaise) {

@@ -96,17 +96,6 @@ TEST(Trace, VolumeSettingsTextAppliesWellFormedItemsAndSkipsTheRest) {
   EXPECT_EQ(GetTraceVolume(c), 0);
 }
 
-TEST(Trace, InstallingAnswersTheHandlerItReplaces) {
-  TraceRecorder first;
-  TraceRecorder second;  // installs itself over the first
-  EXPECT_EQ(GetMasterTraceHandler(), &second);
-  DebugTrace("to second");
-  EXPECT_TRUE(second.Contains("to second"));
-  EXPECT_FALSE(first.Contains("to second"));
-  EXPECT_FALSE(RemoveMasterTraceHandler(&first));
-  EXPECT_EQ(GetMasterTraceHandler(), &second);
-}
-
 TEST(Trace, WithoutAHandlerTextGoesToStandardError) {
   ASSERT_EQ(GetMasterTraceHandler(), nullptr);
   ::testing::internal::CaptureStderr();

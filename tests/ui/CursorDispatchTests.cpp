@@ -61,16 +61,6 @@ TEST_F(CursorDispatchTest, FirstChanceNodesAreAskedBeforeTheirChildren) {
   EXPECT_THAT(log.Texts(), ElementsAre("panel.cursor(-)"));
 }
 
-TEST_F(CursorDispatchTest, TheModifiersReachTheHandler) {
-  ModifierKeys seen;
-  button->onCursor = [&](UI_Node*, const PointF&, UI_Node::ModKeys inMods) {
-    seen = inMods;
-    return true;
-  };
-  Cursor(PointF(35, 35), ModifierKeys(kModKeyAlt));
-  EXPECT_EQ(seen, ModifierKeys(kModKeyAlt));
-}
-
 TEST_F(CursorDispatchTest, ACustomCursorFunctionThatTakesOverAnswersForTheNode) {
   using CursorFunction = boost::function<bool(UI_Node*, const PointF&, UI_Node::ModKeys, bool&)>;
   std::vector<UI_Node*> targets;

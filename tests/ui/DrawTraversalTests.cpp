@@ -194,13 +194,5 @@ TEST_F(DrawTraversal, ChildrenPaintInTheColoursOfTheirTheme) {
   EXPECT_EQ(paints[1].color, ColorRGBA(0, 0, 1, 1));
 }
 
-TEST_F(DrawTraversal, TheDrawSupplierComesFromTheRootAndIsNullWithoutOne) {
-  auto a = AddPaintingView("a", 0, 0, 10, 10, 3, &log, root.get());
-  EXPECT_EQ(a->UI_GetDrawSupplier(), nullptr);
-  std::vector<UI_Node::RectL> segments;
-  a->UI_GetDrawSegments(segments);
-  EXPECT_TRUE(segments.empty());
-}
-
 }  // namespace
 }  // namespace norvik::ui::test

@@ -99,12 +99,6 @@ TEST_F(FocusOSTest, KillFocusToAWindowOutsideLosesFocus) {
   EXPECT_EQ(mLog, (FocusLog{{"window", kFocusChangeLoss, false}, {"field", kFocusChangeLoss, false}}));
 }
 
-TEST_F(FocusOSTest, KillFocusToNoWindowLosesFocus) {
-  mWindow->UI_GainKeyboardFocus(kFocusChangeMouse);
-  UI_Node::UI_OSKillFocus(mWindow.get(), 0);
-  EXPECT_EQ(FocusLeafID(), "");
-}
-
 TEST_F(FocusOSTest, KillFocusToOneOfOurWindowsHandsFocusOver) {
   FocusableViewP field = AddView(*mWindow, "field", &mLog);
   field->UI_GainKeyboardFocus(kFocusChangeMouse);

@@ -113,12 +113,6 @@ TEST_F(InputCaptureTest, EndRunsExactlyOnceAlsoAfterCancel) {
   EXPECT_TRUE(capture->cancelledAtEnd);
 }
 
-TEST_F(InputCaptureTest, EndingWithNothingStoredDoesNothing) {
-  manager.EndInputCapture(true);
-  EXPECT_FALSE(manager.HasInputCapture());
-  EXPECT_THAT(captureLog, IsEmpty());
-}
-
 TEST_F(InputCaptureTest, ACancelledCaptureIsKeptButEventsGoToTheTreeAgain) {
   LoggingCaptureP capture = StartDrag();
   capture->Cancel();

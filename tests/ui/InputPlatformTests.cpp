@@ -53,14 +53,5 @@ TEST(InputPlatformOverNativeLayer, AnAltShortcutRemovesOnePendingSystemCharacter
   EXPECT_FALSE(layer.PeekMessage(left, window, kOSMsgSysChar, kOSMsgSysChar, false));
 }
 
-TEST(InputPlatformOverNativeLayer, TheDefaultCursorIsTheSystemArrow) {
-  HeadlessWindowSystem system;
-  system.Install();
-  OS_NativeLayer& layer = system.GetLayer();
-  layer.SetCursor(layer.LoadSystemCursor(kOSCursorHand));
-  GetInputPlatform().SetDefaultCursor();
-  EXPECT_EQ(layer.GetCursor(), layer.LoadSystemCursor(kOSCursorArrow));
-}
-
 }  // namespace
 }  // namespace norvik::ui

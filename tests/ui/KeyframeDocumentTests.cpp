@@ -173,11 +173,6 @@ TEST_F(DefaultKeyframes, LowBrightnessIsTheDarkLookAndHighBrightnessTheLight) {
   EXPECT_EQ(theme->GetIconType(), 1) << "the dark \"_D\" glyphs on the light panels";
 }
 
-TEST_F(DefaultKeyframes, TheDefaultBrightnessIsDarkerThanHalfway) {
-  EXPECT_FLOAT_EQ(theme->GetBrightness(), 0.25f);
-  EXPECT_LT(theme->GetColor(2).red, 0.5f);
-}
-
 TEST_F(DefaultKeyframes, AccentColoursAndOverlaysKeepTheirPaletteValues) {
   ThemeP plain(new Theme(379, 3));
   theme->SetBrightness(0);

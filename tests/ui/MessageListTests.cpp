@@ -32,11 +32,6 @@ TEST(MessageT, CarriesItsSubjectAndCanBeRetargeted) {
   EXPECT_EQ(dynamic_cast<ValueChangedMessage&>(base).mOld, 3);
 }
 
-TEST(MessageT, DefaultsToNoSubject) {
-  MessageT<const Subject> message;
-  EXPECT_EQ(message.GetSubject(), nullptr);
-}
-
 TEST(NotificationList, FiresEntriesInInstallationOrderWithTheArguments) {
   NotificationList<void(int, const std::string&)> list;
   std::vector<std::string> calls;
@@ -141,26 +136,6 @@ TEST(NotificationList, SurvivesACallbackThatDestroysTheListsOwner) {
   raw->changed.Notify();
   EXPECT_EQ(owner, nullptr);
   EXPECT_EQ(calls, (std::vector<int>{1, 2}));
-}
-
-TEST(NotifyAll, WorksOnAPlainVectorOfSharedFunctions) {
-  std::vector<boost::shared_ptr<boost::function<void(int&)>>> list;
-  list.push_back(MakeNotification<void(int&)>([](int& n) { n += 1; }));
-  list.push_back(nullptr);
-  list.push_back(MakeNotification<void(int&)>([](int& n) { n *= 10; }));
-  int value = 2;
-  NotifyAll(list, value);
-  EXPECT_EQ(value, 30);
-}
-
-TEST(NotificationList, ClearDropsEveryEntry) {
-  NotificationList<void()> list;
-  int calls = 0;
-  list.Install(MakeNotification<void()>([&] { ++calls; }));
-  list.Clear();
-  list.Notify();
-  EXPECT_TRUE(list.empty());
-  EXPECT_EQ(calls, 0);
 }
 
 }  // namespace

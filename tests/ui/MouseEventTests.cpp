@@ -15,41 +15,6 @@ MouseEvent Make(MouseEvent::Action inAction, int inButton, int inClicks, Modifie
                     inAxis);
 }
 
-TEST(MouseEventConstruction, KeepsEveryFieldAndStartsThePhysicalButtonAtTheButton) {
-  OS_Event os(42, kOSMsgMouseWheel, 0x780000, 0x00050006, 1234);
-  MouseEvent e(MouseEvent::kActionWheel, MouseEvent::kButtonRight, 0, Point(1.5f, -2.0f), ModifierKeys(kModKeyAlt), os,
-               -3, MouseEvent::kWheelAxisHorizontal, 12.5f, 0.25f);
-  EXPECT_EQ(e.GetAction(), MouseEvent::kActionWheel);
-  EXPECT_TRUE(e.IsAction(MouseEvent::kActionWheel));
-  EXPECT_FALSE(e.IsAction(MouseEvent::kActionMove));
-  EXPECT_EQ(e.GetButton(), 4);
-  EXPECT_EQ(e.GetPhysicalButton(), 4);
-  EXPECT_EQ(e.GetClickCount(), 0);
-  EXPECT_EQ(e.GetPosition(), Point(1.5f, -2.0f));
-  EXPECT_EQ(e.GetModKey(), ModifierKeys(kModKeyAlt));
-  EXPECT_EQ(e.GetOSEvent().GetHWnd(), 42u);
-  EXPECT_EQ(e.GetOSEvent().GetMsg(), 522u);
-  EXPECT_EQ(e.GetOSEvent().GetTime(), 1234);
-  EXPECT_EQ(e.GetMouseWheelDelta(), -3);
-  EXPECT_EQ(e.GetMouseWheelAxis(), 0);
-  EXPECT_FLOAT_EQ(e.GetRotationDegrees(), 12.5f);
-  EXPECT_FLOAT_EQ(e.GetMagnificationAmount(), 0.25f);
-}
-
-TEST(MouseEventConstruction, CopiesAreIndependentOfTheOriginal) {
-  MouseEvent original = Make(MouseEvent::kActionButtonDown, 1, 1);
-  MouseEvent copy = original;
-  copy.SetPosition(Point(100, 200));
-  copy.SetPhysicalButton(MouseEvent::kButtonRight);
-  EXPECT_EQ(original.GetPosition(), Point(3, 4));
-  EXPECT_EQ(original.GetPhysicalButton(), 1);
-  MouseEvent assigned = Make(MouseEvent::kActionMove, 0, 0);
-  assigned = copy;
-  EXPECT_EQ(assigned.GetPosition(), Point(100, 200));
-  EXPECT_EQ(assigned.GetAction(), MouseEvent::kActionButtonDown);
-  EXPECT_EQ(assigned.GetPhysicalButton(), 4);
-}
-
 TEST(MouseEventButtons, IsButtonTestsBitsOfTheHeldSet) {
   MouseEvent e = Make(MouseEvent::kActionMove, MouseEvent::kButtonLeft | MouseEvent::kButtonRight, 0);
   EXPECT_TRUE(e.IsButton(MouseEvent::kButtonLeft));

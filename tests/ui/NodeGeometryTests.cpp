@@ -16,12 +16,6 @@ using Matrix = tarsel::geom::ScaleMatrixT<float>;
 
 using NodeRectangles = ManagerTest;
 
-TEST_F(NodeRectangles, LocalRectIsInParentCoordinatesOrAtTheOrigin) {
-  auto v = MakeView(5.5f, 6, 10.25f, 20);
-  EXPECT_EQ(v->UI_GetLocalRectF(true), RectF(5.5f, 6, 10.25f, 20));
-  EXPECT_EQ(v->UI_GetLocalRectF(false), RectF(0, 0, 10.25f, 20));
-}
-
 TEST_F(NodeRectangles, IntegerRectEnclosesTheFloatRect) {
   auto v = MakeView(5.5f, -1.25f, 10.25f, 2.5f);
   // floor(5.5)=5, ceil(15.75)=16; floor(-1.25)=-2, ceil(1.25)=2

@@ -452,20 +452,6 @@ TEST_F(ManagerSeams, TheTipForDisplayClimbsToAnAncestorThatShowsTipsForItsChildr
 
 // ---------------------------------------------------------------------------
 
-TEST(CustomSettings, TheTableStartsWithTheToolkitsDefaults) {
-  CustomSettingsManager settings;
-  EXPECT_TRUE(settings.GetBool("norvik.controls.UI_Button.LoseFocusOnESC", false));
-  EXPECT_TRUE(settings.GetBool("norvik.controls.UI_TextEdit.LoseFocusOnPreMouse", false));
-  EXPECT_FALSE(settings.GetBool(
-      "norvik.controls.UI_HotTextNumber.ShowBlankEditFieldsForHotNumbersWithunknownState", true));
-  EXPECT_FALSE(settings.GetBool("norvik.controls.UI_SliderGap", true));
-  EXPECT_EQ(settings.GetLong("norvik.controls.UI_SliderCenterTick_Height", 0), 12);
-  EXPECT_EQ(settings.GetLong("norvik.controls.UI_SliderCenterTick_Gap", 5), 0);
-  EXPECT_FALSE(settings.GetBool("norvik.controls.UI_SliderCenterTick_Color", true));
-  EXPECT_TRUE(settings.GetBool("norvik.ui.windows.ShowCloseBoxOnModalDialogs", true));
-  EXPECT_FALSE(settings.Find("norvik.utils.FontDependentBaselines").has_value());
-}
-
 TEST(CustomSettings, AValueOfAnotherTypeAnswersTheFallbackAndReloadRestoresDefaults) {
   CustomSettingsManager settings;
   settings.Set("norvik.controls.UI_SliderCenterTick_Height", 20.0);

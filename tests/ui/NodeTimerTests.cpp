@@ -37,30 +37,12 @@ class NodeTimerTest : public ::testing::Test {
   FocusableViewP mView;
 };
 
-TEST_F(NodeTimerTest, AnInstalledTimerIsARecordOfTheWindowsManager) {
-  mView->UI_InstallTimer(0.5f, 7);
-  UI_NodeTimerData* data = mWindow->Timers().GetTimerData(OnlyKey());
-  ASSERT_NE(data, nullptr);
-  EXPECT_EQ(data->GetNode(), mView.get());
-  EXPECT_EQ(data->GetTimerID(), 7);
-  EXPECT_EQ(data->GetMilliseconds(), 500u);
-}
-
 TEST_F(NodeTimerTest, InstallingTheSameIDTwiceKeepsOneTimerWithTheLaterInterval) {
   mView->UI_InstallTimer(0.5f, 7);
   mView->UI_InstallTimer(0.25f, 7);
   EXPECT_EQ(mWindow->Timers().GetTimerCount(), 1u);
   EXPECT_FLOAT_EQ(mWindow->Timers().GetTimerData(OnlyKey())->GetSeconds(), 0.25f);
   EXPECT_EQ(mWindow->CreatedTimers().size(), 2u);
-}
-
-TEST_F(NodeTimerTest, DifferentIDsAreDifferentTimers) {
-  mView->UI_InstallTimer(0.5f, 1);
-  mView->UI_InstallTimer(0.5f, 2);
-  EXPECT_EQ(mWindow->Timers().GetTimerCount(), 2u);
-  EXPECT_TRUE(mView->UI_RemoveTimer(1, false));
-  EXPECT_FALSE(mView->UI_RemoveTimer(1, false));
-  EXPECT_EQ(mWindow->Timers().GetTimerCount(), 1u);
 }
 
 TEST_F(NodeTimerTest, ANodeOutsideAnyWindowInstallsNothing) {

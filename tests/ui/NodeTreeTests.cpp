@@ -27,17 +27,6 @@ void ExpectIndicesMatchPositions(UI_Node& inParent) {
 
 using NodeTree = ManagerTest;
 
-TEST_F(NodeTree, ANewViewIsDetachedHiddenEnabledAndNamedAfterItsClass) {
-  UI_SubViewP v(new UI_SubView);
-  EXPECT_EQ(v->UI_GetIndex(), -1);
-  EXPECT_EQ(v->UI_GetParentNode(), nullptr);
-  EXPECT_TRUE(v->UI_GetStateFlags().IsEmpty());
-  EXPECT_TRUE(v->UI_IsEnabled());
-  EXPECT_FALSE(v->UI_IsShown());
-  EXPECT_EQ(v->UI_GetNodeID(), UTF8String("UI_SubView"));
-  EXPECT_EQ(v->UI_GetViewFlags(), 0);
-}
-
 TEST_F(NodeTree, PushBackAppendsInZOrderAndNumbersChildren) {
   auto root = MakeView(0, 0, 100, 100, nullptr, "root");
   MakeView(0, 0, 10, 10, root.get(), "a");

@@ -55,14 +55,6 @@ class OpenGLViewTest : public NativeWindowTest {
   }
 };
 
-TEST_F(OpenGLViewTest, ANewViewHasNoContextAndNoWindowForOne) {
-  LoggingGLViewP view = MakeView(UI_Node::RectL(0, 0, 40, 30));
-  EXPECT_FALSE(view->HasOpenGLContext());
-  EXPECT_EQ(view->GetOpenGLWindow(), 0u);
-  EXPECT_EQ(view->GetDeviceContext(), 0u);
-  EXPECT_TRUE(view->log.empty()) << "nothing is made before the view has a parent";
-}
-
 TEST_F(OpenGLViewTest, APaintRunsPreDrawAndPostInOrderWithoutAContext) {
   auto top = MakeTopLevel(OS_Rect(0, 0, 120, 100));
   LoggingGLViewP view = MakeView(UI_Node::RectL(10, 10, 60, 50));

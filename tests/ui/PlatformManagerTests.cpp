@@ -101,12 +101,6 @@ TEST_F(PlatformManager, ImagesAreReadThroughTheInstalledResourcesWithThePlatform
   EXPECT_EQ(manager.GetDrawbotImageResourceCache()->GetSize(), 0u);
 }
 
-TEST_F(PlatformManager, InstallingAMakerAnswersTheOneItReplaces) {
-  Install(&ProbeResources::Make);
-  EXPECT_EQ(InstallModuleResourceManagerMaker(nullptr), &ProbeResources::Make);
-  EXPECT_EQ(InstallModuleResourceManagerMaker(&ProbeResources::Make), nullptr);
-}
-
 TEST_F(PlatformManager, ThePlatformSupplierOutlivesTheManagersThatShareIt) {
   drawbot::SupplierInterface* shared = nullptr;
   {

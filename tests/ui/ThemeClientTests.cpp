@@ -27,14 +27,6 @@ ThemeSupplier SupplierOf(ThemeP inTheme) {
 
 using ThemeClientTest = ThemeRegistryTest;
 
-TEST_F(ThemeClientTest, ANewClientUsesTheDefaultTheme) {
-  ThemeP theme(new Theme(379, 3));
-  Theme::Initialize(theme);
-  CountingClient client;
-  EXPECT_EQ(client.UI_GetCurrentTheme(), theme);
-  EXPECT_EQ(client.GetThemeColor(19), theme->GetColor(19));
-}
-
 TEST_F(ThemeClientTest, ASuppliedThemeIsUsedAndResetGoesBackToTheDefault) {
   ThemeP other(new Theme(379, 3));
   other->SetColor(19, drawbot::ColorRGBA(1, 0, 0, 1));

@@ -55,14 +55,6 @@ TEST(ThemePalette, AnUnknownIdentifierAnswersADefaultWithoutFailing) {
   EXPECT_NO_THROW(theme->GetColor(5000));
 }
 
-TEST(ThemePalette, StartsAtTheDefaultBrightnessSchemeAndAnOpaqueBlackTint) {
-  ThemeP theme(new Theme(379, 3));
-  EXPECT_FLOAT_EQ(theme->GetBrightness(), 0.25f);
-  EXPECT_EQ(theme->GetFontSizeScheme(), 1u);
-  EXPECT_EQ(theme->GetTinting(), drawbot::ColorRGBA(0, 0, 0, 1));
-  EXPECT_EQ(theme->GetThemeChangeCount(), 0u);
-}
-
 TEST(ThemeFonts, ThreeFontsShareTheFirstCandidateAtSizeEleven) {
   ScPrivateConfigDir config;
   ThemeP theme(new Theme(379, 3));
@@ -91,12 +83,6 @@ TEST_F(GB18030Setting, TheSettingAndAnAvailableFontSelectTheGB18030Font) {
   ThemeP theme(new Theme(379, 3));
   EXPECT_EQ(theme->GetFontName(0), u"SimSun-18030");
   EXPECT_EQ(theme->GetFontName(2), u"SimSun-18030");
-}
-
-TEST_F(GB18030Setting, AnyOtherValueKeepsTheDefaultFont) {
-  config.WriteCommonSettings("GB18030 UI Support=true\n");
-  Theme::SetFontProbe([](const UTF16String&, float) { return true; });
-  EXPECT_EQ(ThemeP(new Theme(379, 3))->GetFontName(1), u"Tahoma");
 }
 
 TEST_F(GB18030Setting, AFontThePlatformCannotMakeKeepsTheDefaultFont) {

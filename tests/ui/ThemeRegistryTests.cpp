@@ -88,12 +88,6 @@ TEST_F(ThemeRegistry, FreeFunctionsReadTheDefaultTheme) {
   EXPECT_EQ(GetThemeChangeCount(), 1u);
 }
 
-TEST_F(ThemeRegistry, TheConstantsHaveTheirDocumentedValues) {
-  EXPECT_EQ(GetDefaultThemeName(), u"DefaultTolliverTheme");
-  EXPECT_FLOAT_EQ(GetDefaultBrightness(), 0.25f);
-  EXPECT_EQ(GetDefaultFontSizeScheme(), 1u);
-}
-
 TEST(ThemeChangeNotification, CountsEachNotificationAndCallsFunctionsInInstallOrder) {
   ThemeP theme(new Theme(379, 3));
   std::vector<int> calls;

@@ -54,15 +54,6 @@ TEST_F(ViewContainerTest, InvalidatingAViewRepaintsItWithItsNewColour) {
   EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(1, 0, 0));
 }
 
-TEST_F(ViewContainerTest, ANewContainerIsAHiddenParentlessPopup) {
-  OS_ViewContainerP container(new OS_ViewContainer(true));
-  ASSERT_NE(container->GetHandle(), 0u);
-  EXPECT_FALSE(container->UI_IsShown());
-  EXPECT_EQ(mLayer.GetParent(container->GetHandle()), 0u);
-  EXPECT_NE(mLayer.GetStyle(container->GetHandle()) & kOSStylePopup, 0u);
-  EXPECT_EQ(container->UI_GetNodeID(), "OS_ViewContainer");
-}
-
 TEST_F(ViewContainerTest, ARectangleSetBeforeTheContainerHadAParentIsAppliedAgainAfterItArrives) {
   auto top = MakeTopLevel(OS_Rect(100, 100, 400, 300));
   OS_ViewContainerP container(new OS_ViewContainer(false));

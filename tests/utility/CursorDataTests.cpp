@@ -72,11 +72,6 @@ TEST_F(CursorData, AVersionOneDocumentGivesItsHotSpot) {
   EXPECT_EQ(Load(Document(VersionPair("1.0") + HotSpotPair(7, 12))), HotSpot(7, 12));
 }
 
-TEST_F(CursorData, TheNameIsFoundWhateverItsCase) {
-  mResources.Put("CURSORDATAID-41", "XML", Document(VersionPair("1.0") + HotSpotPair(3, 4)));
-  EXPECT_EQ(LoadCursorHotSpot(u"cursordataid-41", mResources), HotSpot(3, 4));
-}
-
 TEST_F(CursorData, AMissingDocumentGivesTheTopLeftCorner) {
   EXPECT_EQ(LoadCursorHotSpot(u"CursorDataID-999", mResources), HotSpot(0, 0));
 }

@@ -139,13 +139,6 @@ TEST_F(ImageCache, AMissingReaderOrSupplierRaisesTheAccessErrorOnAMiss) {
   EXPECT_EQ(mCache.GetImage(nullptr, mPlatform, "Gripper", kImageFileTypePNG).get(), image.get());
 }
 
-TEST_F(ImageCache, ClearDropsEveryEntry) {
-  mCache.GetImage(&mLibrary, mPlatform, "Gripper", kImageFileTypePNG);
-  mCache.GetImage(&mLibrary, mRecording.get(), "Gripper", kImageFileTypePNG);
-  mCache.Clear();
-  EXPECT_EQ(mCache.GetSize(), 0u);
-}
-
 TEST(NodeManagerImages, GetImageGoesThroughTheManagersCacheAndResources) {
   ui::UI_NodeManager manager;
   manager.SetResourceManager(std::make_unique<OS_ResourceManager>());
