@@ -1,0 +1,65 @@
+#pragma once
+// The element of an arrangement tree. A leaf states its sizes; a group holds
+// a set of candidate arrangements of its children and picks one at each size.
+// Placement always starts at the root: a child that asks to be arranged hands
+// the request up, so that siblings never see a stale distribution.
+#include <boost/function.hpp>
+
+#include "arrange/ArrangeTypes.h"
+
+namespace norvik::arrange {
+
+namespace impl {
+class ArrangementSet;
+}
+
+class IArrangeable {
+ public:
+  explicit IArrangeable(IArrangeable* inParent = nullptr);
+  virtual ~IArrangeable();
+  IArrangeable(const IArrangeable&) = delete;
+  IArrangeable& operator=(const IArrangeable&) = delete;
+
+  virtual bool VisitChildren(boost::function<bool(IArrangeable const&)> inVisitor) const;
+  virtual bool VisitChildren(boost::function<bool(IArrangeable&)> inVisitor);
+  virtual void RebuildSelf();
+  virtual impl::ArrangementSet& ArrangementsSelf() = 0;
+
+  IArrangeable* Parent() const { return mParent; }
+  void SetParent(IArrangeable* inParent) { mParent = inParent; }
+
+  impl::ArrangementSet& Arrangements();
+  PointF BestSize();
+  PointF Arrange(RectF const& inRect);
+  void Rearrange();
+  void Invalidate();
+  void InvalidateAll();
+  void EnableArrangement(bool inEnable);
+  bool ArrangementEnabled() const;
+
+  bool IsBuilt() const { return mBuilt; }
+  RectF LastRectangle() const { return mLastRect; }
+
+ protected:
+  // Called on a parent while one of its children is being destroyed, so that
+  // a group that lists its children can drop the entry before the next walk.
+  virtual void ChildDestroyed(IArrangeable& inChild);
+
+ private:
+  IArrangeable& Root();
+  const IArrangeable& Root() const;
+  void RebuildIfNeeded();
+  PointF ArrangeAtRoot(RectF const& inRect);
+
+  bool mBuilt = false;
+  bool mArrangementEnabled = true;
+  bool mArranging = false;  // at a root: a placement is running
+  RectF mLastRect;
+  IArrangeable* mParent = nullptr;
+};
+
+IArrangeable* Parent(IArrangeable& inElement);
+bool VisitChildren(IArrangeable& inElement, boost::function<bool(IArrangeable&)> inVisitor);
+bool VisitChildren(IArrangeable const& inElement, boost::function<bool(IArrangeable const&)> inVisitor);
+
+}  // namespace norvik::arrange
