@@ -228,17 +228,6 @@ TEST_F(ButtonBarTest, SetValueSelectsTheMatchingButtonWithoutTellingAnyone) {
   EXPECT_THAT(valuesHeard, ElementsAre(1.0));
 }
 
-TEST_F(ButtonBarTest, ADisabledButtonTakesNoClick) {
-  bar->SetValue(0.25);
-  bar->UI_SetButtonEnabled(1, false);
-  Click(1);
-  EXPECT_THAT(Values(), ElementsAre(1, 0, 0));
-  EXPECT_THAT(heard, IsEmpty());
-  bar->UI_SetButtonEnabled(1, true);
-  Click(1);
-  EXPECT_THAT(Values(), ElementsAre(0, 1, 0));
-}
-
 TEST_F(ButtonBarTest, ARemovedButtonLeavesTheRow) {
   bar->SetValue(1.0);
   bar->ChildRemove(bar->GetButton(0));

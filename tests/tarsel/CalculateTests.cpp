@@ -26,54 +26,41 @@ std::string ErrorOf(std::u16string_view text, unsigned short flags = kCalculateN
 
 }  // namespace
 
-TEST(Calculate, FollowsTheUsualPrecedenceAndLeftToRightOrder) {
-  EXPECT_DOUBLE_EQ(Calc(u"1+2*3"), 7);
-  EXPECT_DOUBLE_EQ(Calc(u"(1+2)*3"), 9);
-  EXPECT_DOUBLE_EQ(Calc(u"10-4-3"), 3);
-  EXPECT_DOUBLE_EQ(Calc(u"100/10/5"), 2);
-  EXPECT_DOUBLE_EQ(Calc(u"2*3-4/8"), 5.5);
-}
+// Each row: the text, whether unit names are skipped, and the value.
+struct ValueCase {
+  const char16_t* text;
+  bool units;
+  double value;
+};
+const ValueCase kValueCases[] = {
+    // precedence, left to right; power right-associative and tighter than a sign
+    {u"1+2*3", false, 7}, {u"(1+2)*3", false, 9}, {u"10-4-3", false, 3}, {u"100/10/5", false, 2},
+    {u"2*3-4/8", false, 5.5}, {u"2^3^2", false, 512}, {u"-2^2", false, -4}, {u"2^-1", false, 0.5},
+    {u"(-2)^2", false, 4}, {u"4^0.5*3", false, 6},
+    // signs, decimals, blanks, typographic operators, grouping, exponents
+    {u"-3", false, -3}, {u"--3", false, 3}, {u"+-+3", false, -3}, {u"  1.5 *\t-2  ", false, -3},
+    {u".25+.25", false, 0.5}, {u"4 \u00D7 2 \u00F7 8 \u2212 1", false, 0}, {u"1,000+1", false, 1001},
+    {u"1.5e2/3", false, 50},
+    // equals signs around the expression
+    {u"=2*3", false, 6}, {u"2*3=", false, 6}, {u" = 2*3 = ", false, 6},
+    // unit names, only when asked
+    {u"12pt + 6pt", true, 18}, {u"p6", true, 6}, {u"50%", true, 50}, {u"90\u00B0 / 2", true, 45},
+    {u"2em", true, 2}, {u"1e2mm", true, 100},
+};
 
-TEST(Calculate, PowerIsRightAssociativeAndBindsTighterThanASign) {
-  EXPECT_DOUBLE_EQ(Calc(u"2^3^2"), 512);
-  EXPECT_DOUBLE_EQ(Calc(u"-2^2"), -4);
-  EXPECT_DOUBLE_EQ(Calc(u"2^-1"), 0.5);
-  EXPECT_DOUBLE_EQ(Calc(u"(-2)^2"), 4);
-  EXPECT_DOUBLE_EQ(Calc(u"4^0.5*3"), 6);
-}
-
-TEST(Calculate, UnarySignsDecimalsAndBlanks) {
-  EXPECT_DOUBLE_EQ(Calc(u"-3"), -3);
-  EXPECT_DOUBLE_EQ(Calc(u"--3"), 3);
-  EXPECT_DOUBLE_EQ(Calc(u"+-+3"), -3);
-  EXPECT_DOUBLE_EQ(Calc(u"  1.5 *\t-2  "), -3);
-  EXPECT_DOUBLE_EQ(Calc(u".25+.25"), 0.5);
-  EXPECT_DOUBLE_EQ(Calc(u"4 \u00D7 2 \u00F7 8 \u2212 1"), 0);
-  EXPECT_DOUBLE_EQ(Calc(u"1,000+1"), 1001);
-  EXPECT_DOUBLE_EQ(Calc(u"1.5e2/3"), 50);
-}
-
-TEST(Calculate, EqualsSignsAroundTheExpressionAreIgnored) {
-  EXPECT_DOUBLE_EQ(Calc(u"=2*3"), 6);
-  EXPECT_DOUBLE_EQ(Calc(u"2*3="), 6);
-  EXPECT_DOUBLE_EQ(Calc(u" = 2*3 = "), 6);
+TEST(Calculate, EvaluatesEachRowWithPrecedenceSignsEqualsAndUnitNames) {
+  for (const ValueCase& c : kValueCases) {
+    const unsigned short flags = kCalculateNoLocalization | (c.units ? kCalculateIgnoreUnitNames : 0);
+    EXPECT_DOUBLE_EQ(Calculate(c.text, flags), c.value) << ToStdString(UTF16to8(c.text));
+  }
   EXPECT_EQ(ErrorOf(u"2=3"), "tarsel/utility/Error/CalculateSyntax");
+  EXPECT_EQ(ErrorOf(u"12pt"), "tarsel/utility/Error/CalculateSyntax");
 }
 
 TEST(Calculate, BlankTextHoldsNoNumber) {
   EXPECT_TRUE(std::isnan(Calc(u"")));
   EXPECT_TRUE(std::isnan(Calc(u"   ")));
   EXPECT_TRUE(std::isnan(Calc(u"=")));
-}
-
-TEST(Calculate, UnitNamesAreSkippedOnlyWhenAsked) {
-  EXPECT_DOUBLE_EQ(Calculate(u"12pt + 6pt", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 18);
-  EXPECT_DOUBLE_EQ(Calculate(u"p6", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 6);
-  EXPECT_DOUBLE_EQ(Calculate(u"50%", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 50);
-  EXPECT_DOUBLE_EQ(Calculate(u"90\u00B0 / 2", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 45);
-  EXPECT_DOUBLE_EQ(Calculate(u"2em", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 2);
-  EXPECT_DOUBLE_EQ(Calculate(u"1e2mm", kCalculateIgnoreUnitNames | kCalculateNoLocalization), 100);
-  EXPECT_EQ(ErrorOf(u"12pt"), "tarsel/utility/Error/CalculateSyntax");
 }
 
 TEST(Calculate, LocalisedTextUsesTheDefaultLocaleMarks) {
@@ -88,24 +75,21 @@ TEST(Calculate, LocalisedTextUsesTheDefaultLocaleMarks) {
   EXPECT_DOUBLE_EQ(Calculate(u"1 000 + 2,5", 0), 1002.5);
 }
 
-TEST(Calculate, DivisionByZeroRaisesItsOwnError) {
-  EXPECT_EQ(ErrorOf(u"1/0"), "tarsel/utility/Error/DivisionByZero");
-  EXPECT_EQ(ErrorOf(u"1/(2-2)"), "tarsel/utility/Error/DivisionByZero");
-  EXPECT_EQ(ErrorOf(u"0^-1"), "tarsel/utility/Error/DivisionByZero");
+TEST(Calculate, DivisionByZeroOverflowAndUndefinedPowersRaiseTheirOwnErrors) {
+  const std::pair<const char16_t*, const char*> cases[] = {
+      {u"1/0", "DivisionByZero"},          {u"1/(2-2)", "DivisionByZero"},    {u"0^-1", "DivisionByZero"},
+      {u"1e308*10", "CalculateOverflow"},  {u"-1e308-1e308", "CalculateOverflow"},
+      {u"10^400", "CalculateOverflow"},    {u"1e999", "NumberOutOfRange"},   {u"(-8)^0.5", "CalculateUndefined"},
+  };
+  for (const auto& [text, error] : cases) {
+    EXPECT_EQ(ErrorOf(text), std::string("tarsel/utility/Error/") + error) << ToStdString(UTF16to8(text));
+  }
   try {
     Calc(u"5/0");
     FAIL() << "no exception";
   } catch (const tarsel::config::Exception& e) {
     EXPECT_STREQ(e.what(), "Division by zero.");
   }
-}
-
-TEST(Calculate, ResultsBeyondTheRangeOfADoubleRaiseOverflow) {
-  EXPECT_EQ(ErrorOf(u"1e308*10"), "tarsel/utility/Error/CalculateOverflow");
-  EXPECT_EQ(ErrorOf(u"-1e308-1e308"), "tarsel/utility/Error/CalculateOverflow");
-  EXPECT_EQ(ErrorOf(u"10^400"), "tarsel/utility/Error/CalculateOverflow");
-  EXPECT_EQ(ErrorOf(u"1e999"), "tarsel/utility/Error/NumberOutOfRange");
-  EXPECT_EQ(ErrorOf(u"(-8)^0.5"), "tarsel/utility/Error/CalculateUndefined");
 }
 
 TEST(Calculate, MalformedTextRaisesASyntaxErrorWithItsPosition) {
@@ -119,11 +103,7 @@ TEST(Calculate, MalformedTextRaisesASyntaxErrorWithItsPosition) {
   } catch (const tarsel::config::Exception& e) {
     EXPECT_STREQ(e.what(), "The expression \"1 + x\" cannot be read at position 5.");
   }
-}
-
-TEST(Calculate, EmbeddedNulIsASyntaxError) {
-  UTF16String text(u"1+\0" u"2", 4);
-  EXPECT_EQ(ErrorOf(text), "tarsel/utility/Error/CalculateSyntax");
+  EXPECT_EQ(ErrorOf(UTF16String(u"1+\0" u"2", 4)), "tarsel/utility/Error/CalculateSyntax") << "embedded nul";
 }
 
 TEST(Calculate, DeepNestingRaisesInsteadOfExhaustingTheStack) {

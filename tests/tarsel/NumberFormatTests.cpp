@@ -54,69 +54,55 @@ TEST(NumberToString, EveryIntegerTypeHasAnExactForm) {
   EXPECT_EQ(NumberToString(-9007199254740993LL), u"-9007199254740993");
 }
 
-TEST(NumberToString, RoundsHalfAwayFromZeroOnTheDigitsAReaderSees) {
-  EXPECT_EQ(Format(1.23456, 0, 2, 0), u"1.23");
-  EXPECT_EQ(Format(1.005, 0, 2, 0), u"1.01");
-  EXPECT_EQ(Format(2.675, 0, 2, 0), u"2.68");
-  EXPECT_EQ(Format(-2.5, 0, 0, 0), u"-3");
-  EXPECT_EQ(Format(0.5, 0, 0, 0), u"1");
-  EXPECT_EQ(Format(0.4999, 0, 0, 0), u"0");
-  EXPECT_EQ(Format(9.999, 0, 2, 0), u"10.00");
-  EXPECT_EQ(Format(99.96, 0, 1, 0), u"100.0");
-}
+// Fixed-point formatting in the plain locale: each row is value, minimum
+// width, decimal places, flags and the text.
+struct FormatCase {
+  double value;
+  int width;
+  int places;
+  unsigned short flags;
+  const char16_t* text;
+};
+constexpr unsigned short kSep = kNumberFormatUseSeparator, kSign = kNumberFormatAlwaysSign,
+                         kPad = kNumberFormatPadSign, kNoZeros = kNumberFormatNoTrailingZeros;
+const FormatCase kFormatCases[] = {
+    // rounding half away from zero on the digits a reader sees
+    {1.23456, 0, 2, 0, u"1.23"}, {1.005, 0, 2, 0, u"1.01"}, {2.675, 0, 2, 0, u"2.68"}, {-2.5, 0, 0, 0, u"-3"},
+    {0.5, 0, 0, 0, u"1"}, {0.4999, 0, 0, 0, u"0"}, {9.999, 0, 2, 0, u"10.00"}, {99.96, 0, 1, 0, u"100.0"},
+    // the fraction padded to the places; negative places round to tens and hundreds
+    {1.5, 0, 3, 0, u"1.500"}, {0.001, 0, 4, 0, u"0.0010"}, {123, 0, 0, 0, u"123"}, {1e-7, 0, 2, 0, u"0.00"},
+    {1234, 0, -1, 0, u"1230"}, {1250, 0, -2, 0, u"1300"}, {49, 0, -2, 0, u"0"},
+    // zero after rounding has no minus sign
+    {-0.001, 0, 2, 0, u"0.00"}, {-0.0, 0, 0, 0, u"0"}, {-0.006, 0, 2, 0, u"-0.01"},
+    {1.5, 0, 4, kNoZeros, u"1.5"}, {2.0, 0, 4, kNoZeros, u"2"}, {100, 0, 2, kNoZeros, u"100"},
+    // minimum width: zeros after the sign, or spaces before it
+    {7.5, 6, 1, 0, u"0007.5"}, {-7.5, 6, 1, 0, u"-007.5"}, {-7.5, 6, 1, kNumberFormatLeadingSpaces, u"  -7.5"},
+    {12345, 3, 0, 0, u"12345"}, {5, 1, 0, 0, u"5"}, {5, -10, 0, 0, u"5"},
+    // signs of numbers that are not negative
+    {3, 0, 0, kSign, u"+3"}, {0, 0, 1, kSign, u"+0.0"}, {-3, 0, 0, kSign, u"-3"}, {3, 0, 0, kPad, u" 3"},
+    {-3, 0, 0, kPad, u"-3"}, {3, 0, 0, kPad | kSign, u"+3"}, {3, 4, 0, kSign, u"+003"},
+    // grouping by three
+    {1234567.891, 0, 2, kSep, u"1,234,567.89"}, {-999, 0, 0, kSep, u"-999"}, {-1000, 0, 0, kSep, u"-1,000"},
+    {999.9999, 0, 2, kSep, u"1,000.00"},
+    // too long for fixed point: scientific
+    {1.5e300, 0, 2, 0, u"1.50e+300"}, {-1.5e300, 0, 1, kSep, u"-1.5e+300"}, {1e40, 0, 0, 0, u"1e+40"},
+    {2.5e35, 0, 3, kNoZeros, u"2.5e+35"},
+    // infinity and NaN as symbols
+    {HUGE_VAL, 0, 2, 0, u"\u221E"}, {-HUGE_VAL, 0, 2, 0, u"-\u221E"}, {HUGE_VAL, 0, 2, kSign, u"+\u221E"},
+    {std::nan(""), 0, 2, 0, u"NaN"},
+};
 
-TEST(NumberToString, PadsTheFractionWithZerosToTheDecimalPlaces) {
-  EXPECT_EQ(Format(1.5, 0, 3, 0), u"1.500");
-  EXPECT_EQ(Format(0.001, 0, 4, 0), u"0.0010");
-  EXPECT_EQ(Format(123, 0, 0, 0), u"123");
-  EXPECT_EQ(Format(1e-7, 0, 2, 0), u"0.00");
-}
-
-TEST(NumberToString, NegativeDecimalPlacesRoundToTensAndHundreds) {
-  EXPECT_EQ(Format(1234, 0, -1, 0), u"1230");
-  EXPECT_EQ(Format(1250, 0, -2, 0), u"1300");
-  EXPECT_EQ(Format(49, 0, -2, 0), u"0");
-}
-
-TEST(NumberToString, ZeroAfterRoundingHasNoMinusSign) {
-  EXPECT_EQ(Format(-0.001, 0, 2, 0), u"0.00");
-  EXPECT_EQ(Format(-0.0, 0, 0, 0), u"0");
-  EXPECT_EQ(Format(-0.006, 0, 2, 0), u"-0.01");
-}
-
-TEST(NumberToString, NoTrailingZerosDropsTheEmptyFraction) {
-  EXPECT_EQ(Format(1.5, 0, 4, kNumberFormatNoTrailingZeros), u"1.5");
-  EXPECT_EQ(Format(2.0, 0, 4, kNumberFormatNoTrailingZeros), u"2");
-  EXPECT_EQ(Format(100, 0, 2, kNumberFormatNoTrailingZeros), u"100");
-}
-
-TEST(NumberToString, MinimumWidthPadsWithZerosAfterTheSignOrWithSpacesBeforeIt) {
-  EXPECT_EQ(Format(7.5, 6, 1, 0), u"0007.5");
-  EXPECT_EQ(Format(-7.5, 6, 1, 0), u"-007.5");
-  EXPECT_EQ(Format(-7.5, 6, 1, kNumberFormatLeadingSpaces), u"  -7.5");
-  EXPECT_EQ(Format(12345, 3, 0, 0), u"12345");
-  EXPECT_EQ(Format(5, 1, 0, 0), u"5");
-  EXPECT_EQ(Format(5, -10, 0, 0), u"5");
+TEST(NumberToString, RoundsPadsSignsGroupsAndSwitchesToScientificAsEachRowSays) {
+  for (const FormatCase& c : kFormatCases) {
+    EXPECT_EQ(Format(c.value, c.width, c.places, c.flags), c.text)
+        << c.value << " width " << c.width << " places " << c.places << " flags " << c.flags;
+  }
   // A hostile width is bounded instead of allocating gigabytes.
   EXPECT_EQ(Format(5, 2000000000, 0, kNumberFormatLeadingSpaces).size(),
             static_cast<std::size_t>(kNumberMaxMinimumWidth));
-}
-
-TEST(NumberToString, SignFlagsMarkNumbersThatAreNotNegative) {
-  EXPECT_EQ(Format(3, 0, 0, kNumberFormatAlwaysSign), u"+3");
-  EXPECT_EQ(Format(0, 0, 1, kNumberFormatAlwaysSign), u"+0.0");
-  EXPECT_EQ(Format(-3, 0, 0, kNumberFormatAlwaysSign), u"-3");
-  EXPECT_EQ(Format(3, 0, 0, kNumberFormatPadSign), u" 3");
-  EXPECT_EQ(Format(-3, 0, 0, kNumberFormatPadSign), u"-3");
-  EXPECT_EQ(Format(3, 0, 0, kNumberFormatPadSign | kNumberFormatAlwaysSign), u"+3");
-  EXPECT_EQ(Format(3, 4, 0, kNumberFormatAlwaysSign), u"+003");
-}
-
-TEST(NumberToString, SeparatorGroupsIntegerDigitsByThree) {
-  EXPECT_EQ(Format(1234567.891, 0, 2, kNumberFormatUseSeparator), u"1,234,567.89");
-  EXPECT_EQ(Format(-999, 0, 0, kNumberFormatUseSeparator), u"-999");
-  EXPECT_EQ(Format(-1000, 0, 0, kNumberFormatUseSeparator), u"-1,000");
-  EXPECT_EQ(Format(999.9999, 0, 2, kNumberFormatUseSeparator), u"1,000.00");
+  // The scientific limit is the caller's: a generous one keeps fixed point.
+  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 100).size(), 41u);
+  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 0).size(), 41u);
 }
 
 TEST(NumberToString, LocalisedFormUsesTheDefaultLocaleMarks) {
@@ -127,16 +113,6 @@ TEST(NumberToString, LocalisedFormUsesTheDefaultLocaleMarks) {
   EXPECT_EQ(NumberToString(-1234567, 0, 1, kNumberFormatUseSeparator, 31), u"-1\u202F234\u202F567,0");
 }
 
-TEST(NumberToString, NumbersTooLongForFixedPointSwitchToScientific) {
-  EXPECT_EQ(Format(1.5e300, 0, 2, 0), u"1.50e+300");
-  EXPECT_EQ(Format(-1.5e300, 0, 1, kNumberFormatUseSeparator), u"-1.5e+300");
-  EXPECT_EQ(Format(1e40, 0, 0, 0), u"1e+40");
-  EXPECT_EQ(Format(2.5e35, 0, 3, kNumberFormatNoTrailingZeros), u"2.5e+35");
-  // The limit is the caller's: a generous one keeps fixed point.
-  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 100).size(), 41u);
-  EXPECT_EQ(NumberToString(1e40, 0, 0, kPlain, 0).size(), 41u);
-}
-
 TEST(NumberToString, TheLargestDoublesKeepTheDigitsTheyNeedToReadBack) {
   // Rounding 1.797...e308 to "1.80e+308" would read back as out of range.
   const double max = std::numeric_limits<double>::max();
@@ -145,13 +121,6 @@ TEST(NumberToString, TheLargestDoublesKeepTheDigitsTheyNeedToReadBack) {
   EXPECT_NEAR(StringToNumber(text, kPlain), max, max * 1e-5);
   EXPECT_NEAR(StringToNumber(Format(-max, 0, 0, kNumberFormatUseSeparator), kPlain), -max, max * 1e-5);
   EXPECT_EQ(StringToNumber(Format(1.797692920482154e308, 0, 0, 0), kPlain), 1.79769e308);
-}
-
-TEST(NumberToString, InfinityAndNaNAreWrittenAsSymbols) {
-  EXPECT_EQ(Format(HUGE_VAL, 0, 2, 0), u"\u221E");
-  EXPECT_EQ(Format(-HUGE_VAL, 0, 2, 0), u"-\u221E");
-  EXPECT_EQ(Format(HUGE_VAL, 0, 2, kNumberFormatAlwaysSign), u"+\u221E");
-  EXPECT_EQ(Format(std::nan(""), 0, 2, 0), u"NaN");
 }
 
 TEST(StringToNumber, ReadsPlainNumbersWithSignsBlanksGroupingAndExponents) {

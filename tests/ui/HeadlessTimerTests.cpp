@@ -26,13 +26,6 @@ class HeadlessTimerTest : public HeadlessFixture {
   OS_WindowHandle mWindow = 0;
 };
 
-TEST_F(HeadlessTimerTest, NothingFiresWhileTheClockStandsStill) {
-  mLayer.SetTimer(mWindow, 1, 10);
-  mSystem.Pump();
-  EXPECT_TRUE(Fired().empty());
-  EXPECT_EQ(mLayer.GetTickCount(), 0);
-}
-
 TEST_F(HeadlessTimerTest, ATimerFiresAtEachIntervalWithItsIdAndDeadline) {
   mLayer.SetTimer(mWindow, 7, 100);
   mSystem.AdvanceClock(250);

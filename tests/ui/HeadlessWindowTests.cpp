@@ -100,24 +100,6 @@ TEST_F(HeadlessWindowTest, OwnedWindowsAreDestroyedWithTheirOwner) {
 
 // ---- properties, text, styles, foreign windows ----
 
-TEST_F(HeadlessWindowTest, PropertiesTextAndStylesAreKeptPerWindow) {
-  const OS_WindowHandle a = MakeWindow(OS_Rect(0, 0, 10, 10));
-  const OS_WindowHandle b = MakeWindow(OS_Rect(0, 0, 10, 10));
-  int value = 0;
-  mLayer.SetProperty(a, "norvik::ui::OS_Window::property", &value);
-  EXPECT_EQ(mLayer.GetProperty(a, "norvik::ui::OS_Window::property"), &value);
-  EXPECT_EQ(mLayer.GetProperty(b, "norvik::ui::OS_Window::property"), nullptr);
-  mLayer.RemoveProperty(a, "norvik::ui::OS_Window::property");
-  EXPECT_EQ(mLayer.GetProperty(a, "norvik::ui::OS_Window::property"), nullptr);
-
-  mLayer.SetWindowText(a, u"Title");
-  EXPECT_EQ(mLayer.GetWindowText(a), UTF16String(u"Title"));
-  EXPECT_TRUE(mLayer.GetWindowText(b).empty());
-  mLayer.SetExStyle(b, kOSExStyleToolWindow);
-  EXPECT_EQ(mLayer.GetExStyle(b), std::uint32_t(kOSExStyleToolWindow));
-  EXPECT_EQ(mLayer.GetExStyle(a), 0u);
-}
-
 TEST_F(HeadlessWindowTest, AForeignWindowGetsDefaultHandlingUntilSubclassed) {
   OS_WindowCreateParams params;
   params.rect = OS_Rect(0, 0, 10, 10);

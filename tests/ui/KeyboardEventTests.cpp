@@ -49,17 +49,6 @@ TEST(KeyboardEventForms, CharacterFormWithNoCharactersStillHasOne) {
   EXPECT_EQ(e.GetCharacter(0), 0);
 }
 
-TEST(KeyboardEventForms, NativeOnlyFormHasNoActionNoCharacterAndNoModifiers) {
-  KeyboardEvent e(OS_Event(3, kOSMsgDeadChar, 0, 0));
-  EXPECT_EQ(e.GetAction(), KeyboardEvent::kActionNone);
-  EXPECT_FALSE(e.IsActionKeyDown() || e.IsActionKeyUp() || e.IsActionKeyChar() || e.IsActionKeyDeadChar());
-  EXPECT_EQ(e.GetNumCharacters(), 1u);
-  EXPECT_EQ(e.GetCharacter(0), 0);
-  EXPECT_EQ(e.GetOSCode(), -1);
-  EXPECT_TRUE(e.GetModKey().IsEmpty());
-  EXPECT_EQ(e.GetOSEvent().GetMsg(), kOSMsgDeadChar);
-}
-
 TEST(ShortcutCharacter, LettersOfTheUSLayoutComeOutUpperCase) {
   EXPECT_EQ(KeyDown('Q', 'q').GetShortcutCharacter(), 'Q');
   EXPECT_EQ(KeyDown('Q', 0).GetShortcutCharacter(), 0) << "character 0 is its own result";

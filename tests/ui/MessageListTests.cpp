@@ -22,16 +22,6 @@ class ValueChangedMessage : public MessageT<Subject> {
   int mOld;
 };
 
-TEST(MessageT, CarriesItsSubjectAndCanBeRetargeted) {
-  Subject a, b;
-  ValueChangedMessage message(&a, 3);
-  MessageT<Subject>& base = message;
-  EXPECT_EQ(base.GetSubject(), &a);
-  base.SetSubject(&b);
-  EXPECT_EQ(message.GetSubject(), &b);
-  EXPECT_EQ(dynamic_cast<ValueChangedMessage&>(base).mOld, 3);
-}
-
 TEST(NotificationList, FiresEntriesInInstallationOrderWithTheArguments) {
   NotificationList<void(int, const std::string&)> list;
   std::vector<std::string> calls;

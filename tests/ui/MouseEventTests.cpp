@@ -15,13 +15,6 @@ MouseEvent Make(MouseEvent::Action inAction, int inButton, int inClicks, Modifie
                     inAxis);
 }
 
-TEST(MouseEventButtons, IsButtonTestsBitsOfTheHeldSet) {
-  MouseEvent e = Make(MouseEvent::kActionMove, MouseEvent::kButtonLeft | MouseEvent::kButtonRight, 0);
-  EXPECT_TRUE(e.IsButton(MouseEvent::kButtonLeft));
-  EXPECT_TRUE(e.IsButton(MouseEvent::kButtonRight));
-  EXPECT_FALSE(e.IsButton(MouseEvent::kButtonMiddle));
-}
-
 TEST(MouseEventClicks, SingleDownNeedsADownWithOneClick) {
   EXPECT_TRUE(Make(MouseEvent::kActionButtonDown, 1, 1).IsButtonSingleDown(1));
   EXPECT_TRUE(Make(MouseEvent::kActionButtonDown, 1, 1).IsLeftButtonSingleDown());

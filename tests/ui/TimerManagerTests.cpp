@@ -40,20 +40,6 @@ class TimerManagerTest : public ::testing::Test {
   int mCreated = 0;
 };
 
-TEST_F(TimerManagerTest, CreatedTimerIsFoundUnderItsRecordsAddress) {
-  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
-  const auto key = manager.CreateTimer(kNodeB, 42, 0.25f);
-  UI_NodeTimerData* data = manager.GetTimerData(key);
-  ASSERT_NE(data, nullptr);
-  EXPECT_EQ(UI_NodeTimerManager::KeyOf(data), key);
-  EXPECT_EQ(data->GetNode(), kNodeB);
-  EXPECT_EQ(data->GetTimerID(), 42);
-  EXPECT_FLOAT_EQ(data->GetSeconds(), 0.25f);
-  EXPECT_EQ(mCreated, 1);
-  EXPECT_EQ(manager.GetManagerNode(), kNodeA);
-  EXPECT_NE(manager.GetTimerDataIter(key), manager.End());
-}
-
 TEST_F(TimerManagerTest, UnknownKeyHasNoRecord) {
   UI_NodeTimerManager manager(kNodeA);
   EXPECT_EQ(manager.GetTimerData(12345), nullptr);

@@ -116,12 +116,6 @@ TEST_F(ImageCache, AnImageWithoutItsLightPanelVariantFailsAtTheResource) {
             "Unable to access resource 'RV4_FBColorSwap_D' (type png)");
 }
 
-TEST_F(ImageCache, AFileTypeWithoutResourcesAsksForAnEmptyType) {
-  const auto jpeg = static_cast<drawbot::ImageFileType>(1);
-  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", jpeg); }),
-            "Unable to access resource 'SP_Add_Sm_N' (type )");
-}
-
 TEST_F(ImageCache, BytesThatAreNoPictureRaiseTheDecodersErrorAndCacheNothing) {
   mMemory.Put("Broken", "png", "this is not a PNG file");
   EXPECT_THROW(mCache.GetImage(&mMemory, mPlatform, "Broken", kImageFileTypePNG), tarsel::config::Exception);

@@ -64,25 +64,6 @@ TEST_F(X11BridgeKeyboard, TypedKeysReachTheFocusedNodeWithCodesAndCharacters) {
   EXPECT_TRUE(chars[1].GetModKey().Test(kModKeyShift));
 }
 
-TEST_F(X11BridgeKeyboard, TabMovesTheFocusToTheNextNodeAndShiftTabBack) {
-  ASSERT_EQ(FocusLeaf(), "first");
-  ASSERT_TRUE(mUser->Tap(XKB_KEY_Tab));
-  ASSERT_TRUE(WaitFor([&] { return FocusLeaf() == "second"; })) << "focus is on " << FocusLeaf();
-  EXPECT_EQ(mFirst->Actions(KeyboardEvent::kActionKeyDown).size(), 1u);
-  EXPECT_EQ(mFirst->Actions(KeyboardEvent::kActionKeyDown)[0].GetOSCode(), kKeyTab);
-
-  ASSERT_TRUE(mUser->Key(XKB_KEY_Shift_L, true));
-  ASSERT_TRUE(mUser->Tap(XKB_KEY_Tab));
-  ASSERT_TRUE(mUser->Key(XKB_KEY_Shift_L, false));
-  ASSERT_TRUE(WaitFor([&] { return FocusLeaf() == "first"; })) << "focus is on " << FocusLeaf();
-  // Keys typed now go to the node that has the focus again.
-  mSecond->keys.clear();
-  ASSERT_TRUE(mUser->Tap(XKB_KEY_b));
-  ASSERT_TRUE(WaitFor([&] { return !mFirst->Actions(KeyboardEvent::kActionKeyChar).empty(); }));
-  EXPECT_EQ(mFirst->Actions(KeyboardEvent::kActionKeyChar).back().GetCharacter(), u'b');
-  EXPECT_TRUE(mSecond->Actions(KeyboardEvent::kActionKeyChar).empty());
-}
-
 TEST_F(X11BridgeKeyboard, ADeadKeyComposesWithTheNextLetter) {
   // A key of the server's keyboard becomes the dead acute accent, as on many layouts.
   const xcb_keycode_t grave = mUser->KeycodeOf(XKB_KEY_grave);

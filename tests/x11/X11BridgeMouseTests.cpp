@@ -45,15 +45,6 @@ TEST_F(X11BridgeMouse, AClickReachesTheNodeUnderItAtItsLocalPosition) {
   EXPECT_FLOAT_EQ(inner->Actions(MouseEvent::kActionButtonDown)[0].GetPosition().y, 9.0f);
 }
 
-TEST_F(X11BridgeMouse, AQuickSecondClickCountsTwo) {
-  auto window = MakeMainWindow(OS_Rect(50, 50, 200, 200));
-  auto view = AddRecorder(window.get(), "view", 0, 0, 200, 200);
-  mUser->Click(120, 120);
-  mUser->Click(120, 120);
-  ASSERT_TRUE(WaitFor([&] { return view->Actions(MouseEvent::kActionButtonUp).size() == 2; }));
-  EXPECT_THAT(DownCounts(*view, MouseEvent::kButtonLeft), ElementsAre(1, 2));
-}
-
 TEST_F(X11BridgeMouse, TheRightButtonArrivesAsTheRightButtonAndCountsItsOwnClicks) {
   auto window = MakeMainWindow(OS_Rect(50, 50, 200, 200));
   auto view = AddRecorder(window.get(), "view", 20, 20, 100, 100);

@@ -29,41 +29,12 @@ class X11Input : public X11Fixture {
   OS_WindowHandle mWindow = 0;
 };
 
-TEST_F(X11Input, ARealClickArrivesAsButtonMessagesAtItsClientPosition) {
-  Click(130, 145);
-  ASSERT_TRUE(WaitFor([&] { return Received(kOSMsgLeftButtonUp); }));
-  const auto downs = MessagesOf(kOSMsgLeftButtonDown);
-  ASSERT_EQ(downs.size(), 1u);
-  EXPECT_EQ(downs[0].window, mWindow);
-  EXPECT_EQ(PointParamX(downs[0].lParam), 30);
-  EXPECT_EQ(PointParamY(downs[0].lParam), 45);
-  EXPECT_TRUE(downs[0].wParam & kOSMouseKeyLeft);
-  EXPECT_FALSE(MessagesOf(kOSMsgLeftButtonUp)[0].wParam & kOSMouseKeyLeft);
-}
-
 TEST_F(X11Input, AQuickSecondClickArrivesAsADoubleClick) {
   Click(150, 150);
   Click(150, 150);
   ASSERT_TRUE(WaitFor([&] { return MessagesOf(kOSMsgLeftButtonUp).size() == 2; }));
   EXPECT_EQ(MessagesOf(kOSMsgLeftButtonDown).size(), 1u);
   EXPECT_EQ(MessagesOf(kOSMsgLeftButtonDoubleClick).size(), 1u);
-}
-
-TEST_F(X11Input, RightButtonAndWheelTurnsArrive) {
-  MovePointer(160, 160);
-  Button(3, true);
-  Button(3, false);
-  Button(4, true);
-  Button(4, false);
-  Button(5, true);
-  Button(5, false);
-  ASSERT_TRUE(WaitFor([&] { return MessagesOf(kOSMsgMouseWheel).size() == 2; }));
-  EXPECT_TRUE(Received(kOSMsgRightButtonDown));
-  EXPECT_TRUE(Received(kOSMsgRightButtonUp));
-  const auto wheels = MessagesOf(kOSMsgMouseWheel);
-  EXPECT_EQ(static_cast<short>(HighWord(wheels[0].wParam)), 120);
-  EXPECT_EQ(static_cast<short>(HighWord(wheels[1].wParam)), -120);
-  EXPECT_EQ(PointParamX(wheels[0].lParam), 160) << "wheel positions are on the screen";
 }
 
 TEST_F(X11Input, RealKeysArriveAsKeyAndCharacterMessages) {

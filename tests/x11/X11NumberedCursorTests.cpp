@@ -108,22 +108,5 @@ TEST_F(X11NumberedCursors, DisplayingANumberedCursorShowsItsPictureAndHotSpot) {
   }
 }
 
-TEST_F(X11NumberedCursors, EveryNumberedCursorChangesTheCursorOnTheServer) {
-  PointerIntoWindow();
-  std::vector<std::vector<std::uint32_t>> seen;
-  for (int id : utility::GetNativeCursorNumbers()) {
-    SCOPED_TRACE(id);
-    mResources.DisplayCursor(0);
-    const std::vector<std::uint32_t> arrow = Read().pixels;
-    const std::vector<std::uint32_t> expected = Artwork(id).pixels;
-    mResources.DisplayCursor(id);
-    ServerCursor shown;
-    EXPECT_TRUE(WaitFor([&] { return (shown = Read()).pixels == expected; }));
-    EXPECT_NE(shown.pixels, arrow);
-    for (const auto& earlier : seen) EXPECT_NE(shown.pixels, earlier);
-    seen.push_back(shown.pixels);
-  }
-}
-
 }  // namespace
 }  // namespace norvik::test

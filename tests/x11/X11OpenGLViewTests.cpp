@@ -150,15 +150,6 @@ class X11OpenGLView : public X11Fixture {
   std::vector<OS_TopLevelViewContainerP> mWindows;
 };
 
-TEST_F(X11OpenGLView, AViewInARealWindowClearsAndDrawsItsRectangle) {
-  auto window = MakeWindow(OS_Rect(40, 40, 200, 150));
-  RectangleGLViewP view = AddGLView(window.get(), UI_Node::RectL(30, 20, 100, 80));
-  ASSERT_TRUE(view->HasOpenGLContext()) << "no GLX context for the view's window";
-  ASSERT_TRUE(WaitFor([&] { return view->draws > 0; })) << "the view was never painted";
-  EXPECT_FALSE(view->renderer.empty());
-  ExpectDrawnAt(window, 30, 20, "gl-view-drawn");
-}
-
 TEST_F(X11OpenGLView, AClickOnTheGLSurfaceReachesTheViewAtItsPlace) {
   auto window = MakeWindow(OS_Rect(40, 40, 200, 150));
   RectangleGLViewP view = AddGLView(window.get(), UI_Node::RectL(30, 20, 100, 80));

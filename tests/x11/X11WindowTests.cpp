@@ -42,24 +42,6 @@ TEST_F(X11Windows, InvalidatingPartOfAWindowRepaintsOnlyThatPart) {
   EXPECT_EQ(ReadPixel(window, 60, 60), 0x102030u) << "outside the damage the old pixels stay";
 }
 
-TEST_F(X11Windows, CreationSendsCreateThenSizeAndDestructionSendsDestroyMessages) {
-  OS_WindowCreateParams params;
-  params.rect = OS_Rect(10, 10, 64, 48);
-  params.style = kOSStyleOverlappedWindow;
-  const OS_WindowHandle window = mLayer->CreateWindow(params);
-  ASSERT_NE(window, 0u);
-  ASSERT_GE(mMessages.size(), 2u);
-  EXPECT_EQ(mMessages[0].message, kOSMsgNCCreate);
-  const auto sizes = MessagesOf(kOSMsgSize);
-  ASSERT_FALSE(sizes.empty());
-  EXPECT_EQ(PointParamX(sizes.back().lParam), 64);
-  EXPECT_EQ(PointParamY(sizes.back().lParam), 48);
-  mLayer->DestroyWindow(window);
-  EXPECT_TRUE(Received(kOSMsgDestroy));
-  EXPECT_TRUE(Received(kOSMsgNCDestroy));
-  EXPECT_FALSE(mLayer->IsWindow(window));
-}
-
 TEST_F(X11Windows, AWindowDestroyedByAnotherClientHearsItAndIsForgotten) {
   const OS_WindowHandle window = MakeShownWindow(OS_Rect(30, 30, 80, 60), 0x556677);
   mMessages.clear();
@@ -77,32 +59,6 @@ TEST_F(X11Windows, AWindowRefusingCreationIsNotMade) {
   params.rect = OS_Rect(0, 0, 10, 10);
   EXPECT_EQ(mLayer->CreateWindow(params), 0u);
   EXPECT_TRUE(mLayer->EnumerateWindows().empty());
-}
-
-TEST_F(X11Windows, APopupOpensAboveItsOwnerWithoutTakingActivation) {
-  const OS_WindowHandle owner = MakeShownWindow(OS_Rect(100, 100, 300, 200), 0x404040);
-  mLayer->SetActiveWindow(owner);
-  ASSERT_EQ(mLayer->GetActiveWindow(), owner);
-  const OS_WindowHandle popup = MakeShownWindow(OS_Rect(150, 150, 100, 60), 0xE0C000, kOSStylePopup,
-                                                kOSExStyleNoActivate | kOSExStyleTopmost, owner);
-  EXPECT_EQ(mLayer->GetActiveWindow(), owner);
-  EXPECT_EQ(mLayer->GetFocus(), owner);
-  // Stacking order on the server: the popup comes after (above) its owner.
-  xcb_screen_t* screen = xcb_setup_roots_iterator(xcb_get_setup(mUser)).data;
-  xcb_query_tree_reply_t* tree = xcb_query_tree_reply(mUser, xcb_query_tree(mUser, screen->root), nullptr);
-  ASSERT_NE(tree, nullptr);
-  const xcb_window_t* children = xcb_query_tree_children(tree);
-  int ownerAt = -1, popupAt = -1;
-  for (int i = 0; i < xcb_query_tree_children_length(tree); ++i) {
-    if (children[i] == owner) ownerAt = i;
-    if (children[i] == popup) popupAt = i;
-  }
-  std::free(tree);
-  EXPECT_GE(ownerAt, 0);
-  EXPECT_GT(popupAt, ownerAt);
-  xcb_screen_t* root = xcb_setup_roots_iterator(xcb_get_setup(mUser)).data;
-  EXPECT_EQ(PixelSoon(root->root, 175, 175, 0xE0C000u), 0xE0C000u) << "the popup covers its owner on screen";
-  EXPECT_EQ(ReadPixel(root->root, 120, 120), 0x404040u);
 }
 
 TEST_F(X11Windows, ActivationMovesBetweenTopLevelsWithMessagesToBoth) {

@@ -139,21 +139,6 @@ class GalleryOnX11 : public X11Fixture {
   bool mInstalled = false;
 };
 
-TEST_F(GalleryOnX11, AClickThroughXTestOnTheRenderButtonSendsItsChangeMessage) {
-  controls::UI_TextButton* render = Controls()->GetRenderButton();
-  int changes = 0;
-  ui::UI_Node* sender = nullptr;
-  render->NotifyWhenChanged(CountChanges(changes, sender));
-  const ui::OS_Point at = ScreenCentre(render);
-  ASSERT_TRUE(ui::OS_Rect(60, 60, kWidth, kHeight).Contains(at)) << "the button is in the window";
-  ClickAt(at);
-  ASSERT_TRUE(WaitFor([&] { return changes > 0; })) << "no change message from the button";
-  EXPECT_EQ(changes, 1);
-  EXPECT_EQ(sender, render);
-  EXPECT_NE(Controls()->GetStatus().find(u"Render"), UTF16String::npos);
-  EXPECT_EQ(mLayer->GetCapture(), 0u) << "the release ended the button's capture";
-}
-
 TEST_F(GalleryOnX11, AClickOnTheCheckboxTogglesItAndAClickBesideTheWindowDoesNot) {
   controls::UI_Checkbox* snap = Controls()->GetSnapCheckbox();
   ASSERT_TRUE(snap->IsChecked());
