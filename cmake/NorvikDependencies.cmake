@@ -11,4 +11,5 @@ pkg_check_modules(XCB REQUIRED IMPORTED_TARGET
 # OpenGL views draw through GLX, which speaks through an Xlib display.
 find_package(OpenGL REQUIRED COMPONENTS OpenGL GLX)
 pkg_check_modules(XLIB REQUIRED IMPORTED_TARGET x11)
+find_package(JPEG REQUIRED)
 find_package(Threads REQUIRED)

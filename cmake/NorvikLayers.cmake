@@ -32,7 +32,7 @@ function(norvik_add_layer name)
     $<BUILD_INTERFACE:${PROJECT_BINARY_DIR}/generated>)
   target_link_libraries(norvik_${name} PUBLIC
     norvik_flags Boost::headers EXPAT::EXPAT nlohmann_json::nlohmann_json
-    PkgConfig::CAIRO PkgConfig::PANGO PkgConfig::XCB OpenGL::OpenGL OpenGL::GLX PkgConfig::XLIB
+    PkgConfig::CAIRO PkgConfig::PANGO PkgConfig::XCB OpenGL::OpenGL OpenGL::GLX PkgConfig::XLIB JPEG::JPEG
     Threads::Threads ${CMAKE_DL_LIBS})
   foreach(_dep IN LISTS NORVIK_LAYER_DEPS_${name})
     if(TARGET norvik_${_dep})
@@ -80,7 +80,7 @@ function(norvik_add_library)
   target_link_libraries(norvik
     PUBLIC Boost::headers
     PRIVATE norvik_flags EXPAT::EXPAT nlohmann_json::nlohmann_json
-            PkgConfig::CAIRO PkgConfig::PANGO PkgConfig::XCB OpenGL::OpenGL OpenGL::GLX PkgConfig::XLIB
+            PkgConfig::CAIRO PkgConfig::PANGO PkgConfig::XCB OpenGL::OpenGL OpenGL::GLX PkgConfig::XLIB JPEG::JPEG
             Threads::Threads ${CMAKE_DL_LIBS})
   target_link_options(norvik PRIVATE -Wl,--no-undefined)
   set(NORVIK_PRESENT_LAYERS ${NORVIK_PRESENT_LAYERS} PARENT_SCOPE)

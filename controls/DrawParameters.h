@@ -85,6 +85,9 @@ class DrawTextControlBaseParameters {
   void SetTextTruncation(drawbot::TextTruncation inTruncation) { mTruncation = inTruncation; }
   const UTF16String& GetText() const { return mText; }
   void SetText(const UTF16String& inText) { mText = inText; }
+  // Space kept free before the label, inside the face's rectangle.
+  float GetTextIndent() const { return mTextIndent; }
+  void SetTextIndent(float inIndent) { mTextIndent = inIndent; }
 
  private:
   UTF16String mFontName;
@@ -93,6 +96,7 @@ class DrawTextControlBaseParameters {
   drawbot::TextAlignment mAlignment = drawbot::kTextAlignCenter;
   drawbot::TextTruncation mTruncation = drawbot::kTextTruncationEndWithEllipsis;
   UTF16String mText;
+  float mTextIndent = 0;
 };
 
 // What stands on a button's bevel. Faces live on the stack of the Draw

@@ -5,11 +5,12 @@
 // the button is lit.
 #include <boost/function.hpp>
 
+#include "controls/ResourceImageSource.h"
 #include "controls/UI_Button.h"
 
 namespace norvik::controls {
 
-class UI_PictureButton : public UI_Button {
+class UI_PictureButton : public UI_Button, public ResourceImageSource {
  public:
   using ImageSupplyFunction = boost::function<void(UI_PictureSupplyMessage*)>;
 
@@ -30,17 +31,20 @@ class UI_PictureButton : public UI_Button {
   // Paints the bevel and, when the record has one, its image as the face.
   static void Draw(const DrawPictureButtonParameters& inParams, drawbot::Drawbot& inDrawbot);
 
-  // The toolkit's resource image of that name, decoded for inSupplier and
-  // cached, or null when the name is empty or the resources lack it.
-  static const drawbot::ImageInterface* LoadResourceImage(const UTF8String& inName,
-                                                         const drawbot::SupplierInterface* inSupplier);
   // Centres inImage in inRect at whole pixels; disabled images are faded by
   // the alpha of theme colour 306.
   static void DrawPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage,
                           const RectF& inRect, float inScale, float inAlpha, drawbot::Drawbot& inDrawbot);
 
+ protected:
+  // The supplier of the drawing under way, so that a supply function decodes
+  // its image for the surface it lands on; outside a draw, the manager's.
+  const drawbot::SupplierInterface* GetDrawingSupplier() const;
+
  private:
-  const drawbot::ImageInterface* FindImage(const drawbot::SupplierInterface* inSupplier) const;
+  const drawbot::ImageInterface* FindImage() const;
+
+  const drawbot::SupplierInterface* mDrawingSupplier = nullptr;
 
   UTF8String mImageBaseName;
   ImageSupplyFunction mSupply;

@@ -2,6 +2,7 @@
 // A text button with a picture beside its label. The picture is a face drawn
 // by the virtual DrawPicture, so derived buttons (the disclosure triangle)
 // can draw theirs as geometry.
+#include "controls/ResourceImageSource.h"
 #include "controls/UI_TextButton.h"
 
 namespace norvik::controls {
@@ -22,7 +23,7 @@ class DrawPTButtonPicture : public DrawButtonFace {
   float mScale;
 };
 
-class UI_PictureTextButton : public UI_TextButton {
+class UI_PictureTextButton : public UI_TextButton, public ResourceImageSource {
  public:
   // Which parts the button shows.
   enum Style { kStylePictureAndText = 0, kStylePictureOnly = 1, kStyleTextOnly = 2 };
@@ -50,7 +51,7 @@ class UI_PictureTextButton : public UI_TextButton {
 
  protected:
   // Draws the picture into inRect: the resource image of the base name, or
-  // nothing when there is none.
+  // nothing without a base name; a name the resources lack raises.
   virtual void DrawPicture(const DrawParameters& inParams, const RectF& inRect, drawbot::Drawbot& inDrawbot);
 
  private:

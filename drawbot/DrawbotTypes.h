@@ -54,7 +54,7 @@ enum PixelLayout {
   kPixelLayoutBGRA = 6,          // bytes B, G, R, A, straight alpha
   kPixelLayoutBGRAPremul = 7     // bytes B, G, R, A, premultiplied
 };
-enum ImageFileType { kImageFileTypePNG = 0 };
+enum ImageFileType { kImageFileTypeJPG = 0, kImageFileTypePNG = 1 };
 
 // Calls a function on a pointer when its last reference goes: how a pixel
 // buffer stays alive for as long as an image or surface made over it.

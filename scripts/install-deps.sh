@@ -8,7 +8,7 @@ PACKAGES=(
   libboost-dev
   libexpat1-dev nlohmann-json3-dev
   libcairo2-dev libpango1.0-dev libfontconfig-dev fonts-dejavu-core
-  libpng-dev librsvg2-bin
+  libpng-dev libjpeg-dev librsvg2-bin
   libxcb1-dev libxcb-randr0-dev libxcb-xkb-dev libxcb-xtest0-dev libxcb-shape0-dev
   libxcb-render0-dev libxcb-cursor-dev libxcb-xfixes0-dev libxcb-icccm4-dev
   libxkbcommon-dev libxkbcommon-x11-dev

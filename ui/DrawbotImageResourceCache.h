@@ -59,8 +59,8 @@ class DrawbotImageResourceCache {
   // Forgets every cached image.
   void Clear() { mImages.clear(); }
 
-  // The resource type name of an image file type: "png", or empty for a
-  // type that has no resources.
+  // The resource type name of an image file type: "jpg" for 0, "png" for 1,
+  // or empty for a type that has no resources.
   static UTF16String GetResourceTypeName(drawbot::ImageFileType inFileType);
 
  private:

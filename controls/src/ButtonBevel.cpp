@@ -152,12 +152,16 @@ void BevelPainter::Paint(const RectF& inRect) {
   const bool container = mParams.GetDrawContainer();
   const bool outline = mParams.GetDrawOutline();
   if (container) {
+    // Without the outer bevel nothing stands at the edge, so the inner parts
+    // do not step inward for it either.
+    bool edgeDrawn = true;
     if (!Has(UI_ControlView::kStateFocused) && !mParams.GetDefaultAppearance()) {
-      if (outline && mParams.ShouldDrawOuterBevelOutline()) Gradient(r0, OuterGradient());
+      edgeDrawn = outline && mParams.ShouldDrawOuterBevelOutline();
+      if (edgeDrawn) Gradient(r0, OuterGradient());
     } else {
       Outline(r0, 2, Has(UI_ControlView::kStateFocused) ? 18 : disabled ? 309 : 19);
     }
-    if (!inset) {
+    if (edgeDrawn && !inset) {
       r1 = Inset(r1, 1);
       r2 = Inset(r2, 1);
     }

@@ -4,6 +4,7 @@
 
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_RadioButton.h"
+#include "drawbot/DrawHelpers.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
 
@@ -44,6 +45,11 @@ void RingColors(const DrawParameters& inParams, std::uint64_t (&outColors)[4][2]
   if (state.Test(UI_ControlView::kStateFocused)) outColors[0][0] = outColors[0][1] = 161;
 }
 
+// A circle for radio buttons; for check boxes a rectangle whose corners are
+// rounded by inCornerRadius.
+constexpr float kCircle = -1;
+constexpr float kCheckboxCornerRadius = 3;
+
 void AddShape(drawbot::PathInterface& ioPath, const RectF& inRect, bool inRound) {
   if (!inRound) {
     ioPath.AddRect(inRect);
@@ -53,7 +59,8 @@ void AddShape(drawbot::PathInterface& ioPath, const RectF& inRect, bool inRound)
   ioPath.AddArc(PointF(inRect.left + inRect.width / 2, inRect.top + inRect.height / 2), radius, 0, 360);
 }
 
-void PaintRings(const DrawParameters& inParams, const RectF& inBox, bool inRound, drawbot::Drawbot& inDrawbot) {
+void PaintRings(const DrawParameters& inParams, const RectF& inBox, float inCornerRadius,
+                drawbot::Drawbot& inDrawbot) {
   const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
   std::uint64_t colors[4][2];
   RingColors(inParams, colors);
@@ -63,8 +70,11 @@ void PaintRings(const DrawParameters& inParams, const RectF& inBox, bool inRound
     drawbot::LinearShaderP shader(supplier, PointF(r.left, r.top), PointF(r.left, r.top + r.height),
                                   {{0.0f, a}, {kStops[i], Mid(a, b)}, {1.0f, b}});
     drawbot::PathP path(supplier);
+    if (inCornerRadius == kCircle)
+      AddShape(*path, r, true);
+    else
+      GetRoundedRectPath(supplier, r, std::max(0.0f, inCornerRadius - static_cast<float>(i)), &path);
     if (!shader || !path) return;
-    AddShape(*path, r, inRound);
     inDrawbot.GetSurface()->ShadePath(*shader, *path, drawbot::kFillWinding);
     r = RectF(r.left + 1, r.top + 1, r.width - 2, r.height - 2);
   }
@@ -130,7 +140,7 @@ void UI_Checkbox::DrawHelper(const DrawCheckBoxParams& inParams, drawbot::Drawbo
   if (!inDrawbot.GetSurface()) return;
   const auto [column, text] = GetButtonTextRects(inParams.GetCheckSize(), inParams.GetRectF());
   const RectF box = CentredBox(inParams.GetCheckSize(), column);
-  PaintRings(inParams, box, false, inDrawbot);
+  PaintRings(inParams, box, kCheckboxCornerRadius, inDrawbot);
   DrawCheckbox(inParams).Paint(box, inDrawbot);
   DrawTextControlBaseParameters label(inParams);
   label.SetTextAlignment(drawbot::kTextAlignLeft);
@@ -144,7 +154,7 @@ void UI_RadioButton::Draw(const DrawRadioButtonParams& inParams, drawbot::Drawbo
   inDrawbot.GetSurface()->SetAntiAliasPolicy(drawbot::kAntiAlias);
   const auto [column, text] = GetButtonTextRects(inParams.GetButtonSize(), inParams.GetRectF());
   const RectF box = CentredBox(inParams.GetButtonSize(), column);
-  PaintRings(inParams, box, true, inDrawbot);
+  PaintRings(inParams, box, kCircle, inDrawbot);
   if (inParams.GetOn()) {
     drawbot::PathP dot(inDrawbot.GetSupplier());
     drawbot::BrushP brush(inDrawbot.GetSupplier(), MarkColor(inParams));

@@ -30,6 +30,20 @@ class DrawButtonPicture : public DrawButtonFace {
   const drawbot::ImageInterface& mImage;
   float mScale, mAlpha;
 };
+
+// Sets the supplier of the drawing under way, and puts the outer one back.
+class ScDrawingSupplier {
+ public:
+  ScDrawingSupplier(const drawbot::SupplierInterface*& ioSlot, const drawbot::SupplierInterface* inSupplier)
+      : mSlot(ioSlot), mSaved(ioSlot) {
+    mSlot = inSupplier;
+  }
+  ~ScDrawingSupplier() { mSlot = mSaved; }
+
+ private:
+  const drawbot::SupplierInterface*& mSlot;
+  const drawbot::SupplierInterface* mSaved;
+};
 }  // namespace
 
 UI_PictureButton::UI_PictureButton() { UI_SetNodeID("UI_PictureButton"); }
@@ -65,23 +79,14 @@ const drawbot::ImageInterface* UI_PictureButton::GetImage() const {
   return message.GetImage();
 }
 
-// A name that the resources do not hold draws no picture rather than failing
-// the whole paint.
-const drawbot::ImageInterface* UI_PictureButton::LoadResourceImage(const UTF8String& inName,
-                                                                  const drawbot::SupplierInterface* inSupplier) {
+const drawbot::SupplierInterface* UI_PictureButton::GetDrawingSupplier() const {
+  if (mDrawingSupplier) return mDrawingSupplier;
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
-  if (inName.empty() || !manager || !manager->GetDrawbotImageResourceCache() || !inSupplier) return nullptr;
-  try {
-    return manager->GetDrawbotImageResourceCache()
-        ->GetImage(&manager->GetResourceManager(), inSupplier, inName, drawbot::kImageFileTypePNG)
-        .get();
-  } catch (const tarsel::config::Exception&) {
-    return nullptr;
-  }
+  return manager ? manager->GetOSDrawSupplier() : nullptr;
 }
 
-const drawbot::ImageInterface* UI_PictureButton::FindImage(const drawbot::SupplierInterface* inSupplier) const {
-  return mSupply ? GetImage() : LoadResourceImage(mImageBaseName, inSupplier);
+const drawbot::ImageInterface* UI_PictureButton::FindImage() const {
+  return mSupply ? GetImage() : LoadImage(mImageBaseName, GetDrawingSupplier());
 }
 
 void UI_PictureButton::DrawPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage,
@@ -120,13 +125,17 @@ void UI_PictureButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
   DrawPictureButtonParameters params(this);
   FillButtonParameters(params);
   const auto state = params.GetControlState();
+  // A disabled button that is up shows no border, whatever else its state says.
+  const bool disabledUp = state.Test(kStateDisabled) && !state.Test(kStateDown);
   const bool border = ShouldDisplayBorderAlways() ||
-                      (!ShouldDisplayBorderNever() && state != DrawParameters::StateFlags() &&
-                       state != DrawParameters::StateFlags(kStateDisabled));
+                      (!ShouldDisplayBorderNever() && state != DrawParameters::StateFlags() && !disabledUp);
   params.SetDrawOutline(border);
   params.SetDrawContainer(ShouldDisplayContainerAlways() || (border && !ShouldDisplayContainerNever()));
   if (GetDownState()) params.SetOffset(params.GetOffset() + GetDownOffset());
-  params.SetImage(FindImage(inDrawbot->GetSupplier()));
+  {
+    const ScDrawingSupplier drawing(mDrawingSupplier, inDrawbot->GetSupplier());
+    params.SetImage(FindImage());
+  }
   params.SetScale(mScale);
   params.SetAlpha(mAlpha);
   Draw(params, *inDrawbot);

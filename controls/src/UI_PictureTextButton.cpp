@@ -85,7 +85,7 @@ void DrawPTButtonPicture::operator()(DrawParameters::StateFlags, const tarsel::g
 
 void UI_PictureTextButton::DrawPicture(const DrawParameters& inParams, const RectF& inRect,
                                        drawbot::Drawbot& inDrawbot) {
-  const drawbot::ImageInterface* image = UI_PictureButton::LoadResourceImage(mImageBaseName, inDrawbot.GetSupplier());
+  const drawbot::ImageInterface* image = LoadImage(mImageBaseName, inDrawbot.GetSupplier());
   if (!image || !inParams.GetTheme()) return;
   const DrawPTButtonPicture face(inParams, *image, mScale);
   face(inParams.GetControlState(), inRect, PointF(), inDrawbot, *inParams.GetTheme(), inParams.GetColorChangeMap());

@@ -96,7 +96,7 @@ void UI_TextButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
 }
 
 void UI_TextButton::Draw(const DrawTextButtonParameters& inParams, drawbot::Drawbot& inDrawbot) {
-  const DrawButtonText face(inParams, inParams, 0);
+  const DrawButtonText face(inParams, inParams, inParams.GetTextIndent());
   DrawTextButtonParameters withFace(inParams);
   withFace.SetDrawButtonFace(&face);
   UI_Button::Draw(withFace, inDrawbot);

@@ -53,6 +53,7 @@ void UI_TextControlBase::FillTextParameters(DrawTextControlBaseParameters& ioPar
   }
   ioParams.SetTextAlignment(mAlignment);
   ioParams.SetTextTruncation(mTruncation);
+  ioParams.SetTextIndent(mTextIndent);
 }
 
 void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseParameters& inText,

@@ -13,6 +13,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "tarsel/ThrowError.h"
+
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_DisclosureTriangleButton.h"
 #include "controls/UI_PictureButton.h"
@@ -112,6 +114,42 @@ TEST_F(ChromelessTest, AButtonAtRestPaintsNoChromeUntilItIsDown) {
   EXPECT_GT(Painted(*button), 0) << "down is not at rest";
 }
 
+TEST_F(ChromelessTest, AtRestWithoutTheUndrawnInsetTheFillGrowsByTheSkippedBevelOnly) {
+  auto button = Add(new UI_TextButton, RectF(0, 0, 60, 24));
+  auto firstPaintedColumn = [&] {
+    PixelCanvas canvas(60, 24);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    button->UI_Draw(&drawbot);
+    const PixelImage shot = canvas.Snapshot();
+    for (int x = 0; x < shot.width; ++x)
+      if (shot.At(x, 12) != 0u) return x;
+    return -1;
+  };
+  const int inset = firstPaintedColumn();
+  button->SetInsetUndrawnSpace(false);
+  EXPECT_EQ(firstPaintedColumn(), inset - 2) << "no outer bevel drawn, so no step inward for it";
+}
+
+TEST_F(ChromelessTest, TheTextIndentMovesTheLabelRight) {
+  auto button = Add(new UI_TextButton(u"Mute"), RectF(0, 0, 60, 24));
+  button->SetDisplayChromelessNormalState(true);
+  button->SetTextAlignment(drawbot::kTextAlignLeft);
+  auto firstInkedColumn = [&] {
+    PixelCanvas canvas(60, 24);
+    drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+    button->UI_Draw(&drawbot);
+    const PixelImage shot = canvas.Snapshot();
+    for (int x = 0; x < shot.width; ++x)
+      for (int y = 0; y < shot.height; ++y)
+        if (shot.At(x, y) != 0u) return x;
+    return -1;
+  };
+  const int plain = firstInkedColumn();
+  ASSERT_GE(plain, 0) << "the label paints";
+  button->SetTextIndent(12);
+  EXPECT_EQ(firstInkedColumn(), plain + 12);
+}
+
 // ---- the check box mark ----
 
 int MarkPixels(int inValue, bool inUnknown, PixelImage* outImage = nullptr) {
@@ -125,6 +163,17 @@ int MarkPixels(int inValue, bool inUnknown, PixelImage* outImage = nullptr) {
   const PixelImage shot = canvas.Snapshot();
   if (outImage) *outImage = shot;
   return PaintedPixels(shot);
+}
+
+TEST(CheckboxMark, TheBoxHasRoundedCorners) {
+  PixelCanvas canvas(14, 14);
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  DrawCheckBoxParams params;
+  params.SetRectF(RectF(0, 0, 14, 14));
+  UI_Checkbox::DrawHelper(params, drawbot);
+  const PixelImage shot = canvas.Snapshot();
+  EXPECT_NE(shot.At(7, 0), 0u) << "the edge is painted";
+  EXPECT_EQ(shot.At(0, 0), 0u) << "the corner is not";
 }
 
 TEST(CheckboxMark, OffIsBlankOnIsATickMixedAndUnknownAreABar) {
@@ -248,7 +297,7 @@ TEST_F(PictureTextLayout, ThePictureIsTheResourceImageOfTheBaseName) {
   EXPECT_NE(shot.At(4, 9), 0xFF00FF00u);
   EXPECT_NE(shot.At(11, 14), 0xFF00FF00u);
   button->SetImageBaseName("Missing");
-  EXPECT_NE(paint().At(8, 12), 0xFF00FF00u) << "a name the resources lack draws no picture";
+  EXPECT_THROW(paint(), tarsel::config::Exception) << "a name the resources lack raises its error";
 }
 
 }  // namespace

@@ -1,7 +1,7 @@
 // Picture buttons ask their supply function for the image of their state,
 // centre it on whole pixels and fade it when disabled; owner-drawn buttons
 // leave all painting to their owner; lock and link buttons pick their images
-// by state and draw a glyph where the image is missing.
+// by state, and a missing image raises its resource error.
 #include <vector>
 
 #include <gtest/gtest.h>
@@ -12,6 +12,9 @@
 #include "drawbot/DrawbotWrappers.h"
 #include "support/controls/ControlTestSupport.h"
 #include "support/drawbot/PixelCompare.h"
+#include "support/utility/MemoryResourceManager.h"
+#include "tarsel/ThrowError.h"
+#include "ui/DrawbotImageResourceCache.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_NodeManager.h"
 
@@ -62,6 +65,19 @@ TEST_F(PictureButtonTest, ThePictureIsCentredOnWholePixels) {
   EXPECT_EQ(snapshot.At(7, 7), 0xFFFFFFFFu);
 }
 
+TEST_F(PictureButtonTest, ADisabledButtonThatIsUpShowsNoBorderEvenUnderTheMouse) {
+  auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
+  button->UI_SetMouseOverLeafNode(nullptr);
+  button->UI_SetDisabled(true);
+  ASSERT_TRUE(button->GetControlState(true).Test(UI_ControlView::kStateRollover));
+  canvas.Clear(0xFFFFFF);
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  button->UI_Draw(&drawbot);
+  const auto shot = canvas.Snapshot();
+  for (int y = 0; y < 20; ++y)
+    for (int x = 0; x < 20; ++x) ASSERT_EQ(shot.At(x, y), 0xFFFFFFFFu) << x << "," << y;
+}
+
 TEST_F(PictureButtonTest, AnOwnerDrawnButtonPaintsOnlyThroughItsFunction) {
   auto button = Add(new UI_OwnerDrawButton, RectF(0, 0, 20, 20));
   int calls = 0;
@@ -85,25 +101,31 @@ TEST(LockAndLinkImageNames, FollowTheStateRolloverAndIconType) {
   EXPECT_EQ(UI_LinkButton::ImageName(false, 1), UTF8String("RV4_UnconstrainedProportions_D"));
 }
 
-TEST_F(PictureButtonTest, ALockButtonTogglesAndPaintsAGlyphWhenItsImageIsMissing) {
+TEST_F(PictureButtonTest, ALockReadsThroughTheCacheItIsBoundToForTheDrawingsSupplierAndAMissingImageRaises) {
   auto lock = Add(new UI_LockButton, RectF(0, 0, 20, 20));
+  utility::testing::MemoryResourceManager resources;
+  ui::DrawbotImageResourceCache cache;
+  lock->SetResourceManagerImageCache(&resources, &cache);
   Press(PointF(5, 5));
   Release(PointF(5, 5));
   EXPECT_EQ(lock->GetValue(), UI_Button::kButtonOn);
-  EXPECT_EQ(lock->GetImage(), nullptr) << "no image cache in this test";
-  canvas.Clear(0xFFFFFF);
   drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  const UTF8String name = UI_LockButton::ImageName(true, false, lock->UI_GetCurrentTheme()->GetIconType());
+  try {
+    lock->UI_Draw(&drawbot);
+    ADD_FAILURE() << "a missing image drew";
+  } catch (const tarsel::config::Exception& e) {
+    EXPECT_EQ(std::string(e.what()), "Unable to access resource '" + std::string(name.c_str()) + "' (type png)");
+  }
+  cache.CacheImage(canvas.GetSupplier(), name, drawbot::kImageFileTypePNG, image.GetPtr());
+  canvas.Clear(0xFFFFFF);
   lock->UI_Draw(&drawbot);
-  const auto snapshot = canvas.Snapshot();
-  int painted = 0;
-  for (int y = 0; y < 20; ++y)
-    for (int x = 0; x < 20; ++x) painted += snapshot.At(x, y) != 0xFFFFFFFFu ? 1 : 0;
-  EXPECT_GT(painted, 10) << "the vector lock stands in for the image";
+  EXPECT_EQ(canvas.Snapshot().At(10, 10), 0xFFFF0000u) << "the image decoded for the canvas's supplier";
 }
 
 // The manager an application makes carries the toolkit's pictures: the lock
-// shows its artwork for each state, not the stand-in glyph.
-TEST(LockButtonArtwork, UnderThePlatformManagerTheLockShowsItsPicturesNotTheGlyph) {
+// shows its artwork for each state.
+TEST(LockButtonArtwork, UnderThePlatformManagerTheLockShowsAPictureForEachState) {
   ui::OS_NodeManager manager;
   ui::HeadlessWindowSystem system;
   system.Install();
@@ -138,11 +160,6 @@ TEST(LockButtonArtwork, UnderThePlatformManagerTheLockShowsItsPicturesNotTheGlyp
   const auto lockedPixels = paint();
   EXPECT_GT(differing(lockedPixels, unlockedPixels), 4) << "the locked picture is another picture";
 
-  // Without the cache the same button falls back on the glyph.
-  manager.TerminateDrawing();
-  ASSERT_EQ(lock->GetImage(), nullptr);
-  const auto glyphPixels = paint();
-  EXPECT_GT(differing(lockedPixels, glyphPixels), 10) << "the artwork is not the stand-in glyph";
   system.Uninstall();
 }
 

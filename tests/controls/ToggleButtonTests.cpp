@@ -93,6 +93,7 @@ TEST_F(ToggleButtonTest, TheDisclosureMessageArrivesOnlyAfterTheTwirl) {
   ASSERT_EQ(triangle->UI_GetTimerIDs().size(), 1u);
   AdvanceAndFireTimers(triangle.get(), 40);
   EXPECT_THAT(log.entries, IsEmpty()) << "still turning";
+  EXPECT_EQ(root->mUpdateNowCalls, 1) << "each frame of the twirl is painted at once";
   AdvanceAndFireTimers(triangle.get(), 40);
   EXPECT_THAT(log.entries, ElementsAre("changed"));
   EXPECT_EQ(triangle->GetValue(), UI_Button::kButtonOn);

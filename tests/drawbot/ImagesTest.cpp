@@ -204,12 +204,17 @@ TEST(SurfaceImages, WithAFlashDelayTheTargetStillEndsWithTheDrawing) {
   cairo_surface_destroy(target);
 }
 
-TEST(BufferImages, TwentyFourBitPixelsAreDrawnOpaque) {
+TEST(BufferImages, PixelsWithoutAlphaAreDrawnOpaque) {
   unsigned char pixels[8] = {10, 20, 30, 40, 50, 60, 0, 0};  // B, G, R per pixel, rows of 8 bytes
   PixelCanvas canvas(2, 1);
   BufferImageP image(canvas.GetSupplier(), 2, 1, 8, kPixelLayoutRGB24, pixels, nullptr);
   canvas.GetSurface()->DrawImage(*image, PointT<float>(0, 0), 1);
   EXPECT_EQ(canvas.Snapshot().At(0, 0), 0xff1e140au);
+  EXPECT_EQ(canvas.Snapshot().At(1, 0), 0xff3c3228u);
+  // 32-bit pixels without alpha in rows Cairo cannot wrap are copied, still opaque.
+  unsigned char padded[10] = {10, 20, 30, 0, 40, 50, 60, 0, 0, 0};
+  BufferImageP unwrapped(canvas.GetSupplier(), 2, 1, 10, kPixelLayoutRGB32, padded, nullptr);
+  canvas.GetSurface()->DrawImage(*unwrapped, PointT<float>(0, 0), 1);
   EXPECT_EQ(canvas.Snapshot().At(1, 0), 0xff3c3228u);
 }
 

@@ -1,7 +1,9 @@
 // The image cache: one decoded image per name, file type and kind of
 // supplier, read through a resource manager only on a miss; and the node
 // manager's lookup through it.
+#include <fstream>
 #include <functional>
+#include <iterator>
 #include <memory>
 #include <string>
 
@@ -114,6 +116,20 @@ TEST_F(ImageCache, AnImageWithoutItsLightPanelVariantFailsAtTheResource) {
   EXPECT_NO_THROW(mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap", kImageFileTypePNG));
   EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap_D", kImageFileTypePNG); }),
             "Unable to access resource 'RV4_FBColorSwap_D' (type png)");
+}
+
+TEST_F(ImageCache, FileTypesZeroAndOneAskForJpgAndPngAndJpegResourcesDecode) {
+  for (const auto& [type, text] : {std::pair{0, "jpg"}, std::pair{1, "png"}, std::pair{2, ""}})
+    EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mMemory, mPlatform, "None", drawbot::ImageFileType(type)); }),
+              std::string("Unable to access resource 'None' (type ") + text + ")");
+  std::ifstream file(std::string(NORVIK_TEST_DATA_DIR) + "/drawbot/swatch.jpg", std::ios::binary);
+  mMemory.Put("Swatch", "jpg", std::string(std::istreambuf_iterator<char>(file), {}));
+  auto image = mCache.GetImage(&mMemory, mPlatform, "Swatch", drawbot::kImageFileTypeJPG);
+  ASSERT_TRUE(image);
+  EXPECT_EQ(image->GetWidth(), 6u);
+  EXPECT_EQ(image->GetHeight(), 4u);
+  mMemory.Put("Cut", "jpg", "\xFF\xD8\xFF\xE0 not the rest of a JPEG");
+  EXPECT_THROW(mCache.GetImage(&mMemory, mPlatform, "Cut", drawbot::kImageFileTypeJPG), tarsel::config::Exception);
 }
 
 TEST_F(ImageCache, BytesThatAreNoPictureRaiseTheDecodersErrorAndCacheNothing) {

@@ -24,7 +24,13 @@ DrawbotImageResourceCacheKey DrawbotImageResourceCache::MakeKey(drawbot::Supplie
 }
 
 UTF16String DrawbotImageResourceCache::GetResourceTypeName(drawbot::ImageFileType inFileType) {
-  return inFileType == drawbot::kImageFileTypePNG ? u"png" : UTF16String();
+  switch (inFileType) {
+    case drawbot::kImageFileTypeJPG:
+      return u"jpg";
+    case drawbot::kImageFileTypePNG:
+      return u"png";
+  }
+  return UTF16String();
 }
 
 DrawbotImageResourceCache::ImageP DrawbotImageResourceCache::GetImage(ResourceManager const* inResources,

@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "drawbot/src/cairo/CairoObjects.h"
+#include "drawbot/src/cairo/JpegDecoder.h"
 #include "tarsel/ThrowError.h"
 
 namespace norvik::drawbot {
@@ -53,7 +54,8 @@ void AddStops(cairo_pattern_t* inPattern, ColorRGBA const* inColors, float const
 // them in place.
 cairo_surface_t* CopyToImage(unsigned long inWidth, unsigned long inHeight, long inRowBytes, PixelLayout inLayout,
                              unsigned char const* inData) {
-  cairo_format_t format = inLayout == kPixelLayoutRGB24 ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32;
+  const bool opaque = inLayout == kPixelLayoutRGB24 || inLayout == kPixelLayoutRGB32;
+  cairo_format_t format = opaque ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32;
   cairo_surface_t* image = cairo_image_surface_create(format, static_cast<int>(inWidth), static_cast<int>(inHeight));
   if (cairo_surface_status(image) != CAIRO_STATUS_SUCCESS) {
     cairo_surface_destroy(image);
@@ -68,6 +70,9 @@ cairo_surface_t* CopyToImage(unsigned long inWidth, unsigned long inHeight, long
     for (unsigned long x = 0; x < inWidth; ++x) {
       if (inLayout == kPixelLayoutRGB24) {
         unsigned char const* p = src + x * 3;
+        dst[x] = 0xff000000u | (uint32_t(p[2]) << 16) | (uint32_t(p[1]) << 8) | p[0];
+      } else if (inLayout == kPixelLayoutRGB32) {
+        unsigned char const* p = src + x * 4;  // B, G, R and an unused byte
         dst[x] = 0xff000000u | (uint32_t(p[2]) << 16) | (uint32_t(p[1]) << 8) | p[0];
       } else {
         unsigned char const* p = src + x * 4;  // B, G, R, A with straight alpha
@@ -195,7 +200,8 @@ RadialShaderInterface* OSSupplier::NewRadialShader(PointT<float> const& inCentre
 }
 
 ImageInterface* OSSupplier::NewFileImage(ImageFileType inType, void const* inData, unsigned long inSize) const {
-  if (inType != kImageFileTypePNG || inData == nullptr) ThrowDrawingError(kUnableToReadImageFile);
+  if ((inType != kImageFileTypePNG && inType != kImageFileTypeJPG) || inData == nullptr)
+    ThrowDrawingError(kUnableToReadImageFile);
   std::string fileBytes;
   ByteReader reader{static_cast<unsigned char const*>(inData), inSize, 0};
   if (inSize == 0) {
@@ -203,6 +209,11 @@ ImageInterface* OSSupplier::NewFileImage(ImageFileType inType, void const* inDat
     if (!file) ThrowDrawingError(kUnableToReadImageFile);
     fileBytes.assign(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
     reader = ByteReader{reinterpret_cast<unsigned char const*>(fileBytes.data()), fileBytes.size(), 0};
+  }
+  if (inType == kImageFileTypeJPG) {
+    cairo_surface_t* image = DecodeJpeg(reader.data, reader.size);
+    if (!image) ThrowDrawingError(kUnableToReadImageFile);
+    return new OSImageInterface(image);
   }
   cairo_surface_t* image = cairo_image_surface_create_from_png_stream(&ReadBytes, &reader);
   if (cairo_surface_status(image) != CAIRO_STATUS_SUCCESS) {

@@ -65,12 +65,14 @@ class TestWindowNode : public FocusLogging<UI_SubView> {
   const UI_NodeTimerManager* UI_GetTimerManager(bool) const override { return &mTimers; }
   void UI_SetKeyboardFocusWithOS() override { ++mOSSetFocusCalls; }
   bool UI_WantsKeyboardFocus() const override { return mWantsFocus; }
+  void UI_UpdateNow() override { ++mUpdateNowCalls; }
 
   UI_NodeTimerManager& Timers() { return mTimers; }
   // Every record the factory made, in order, with its interval.
   const std::vector<std::pair<long, float>>& CreatedTimers() const { return mCreated; }
 
   int mOSSetFocusCalls = 0;
+  int mUpdateNowCalls = 0;
   bool mWantsFocus = true;
 
  private:
