@@ -6,7 +6,12 @@
 // are added to this class by the archive work.
 #include <map>
 
+#include "tarsel/Flags.h"
 #include "tarsel/UTFString.h"
+
+namespace tarsel::proplist {
+class PropList;
+}
 
 namespace norvik::ui {
 
@@ -42,6 +47,15 @@ class UI_NodeAdapterBase {
   static void UnregisterNode(const UI_Node* inNode);
   static AdapterMap::const_iterator AdapterBegin();
   static AdapterMap::const_iterator AdapterEnd();
+
+  // Number format flags as one boolean per bit ("formatNoLocalization",
+  // "formatLeadingSpaces", ...), plus "formatNormal", which is always written
+  // false and ignored when read. Reading ignores unknown keys and raises the
+  // property-list error for a flag key that does not hold a boolean.
+  static void NumberFormatFlagsToPropList(tarsel::utility::Flags<unsigned short> inFlags,
+                                          tarsel::proplist::PropList& ioList);
+  static tarsel::utility::Flags<unsigned short> NumberFormatFlagsFromPropList(
+      const tarsel::proplist::PropList& inList);
 
  private:
   static AdapterMap& Adapters();
