@@ -10,7 +10,11 @@ cd "$(dirname "$0")/.."
 export CCACHE_BASEDIR="$PWD"
 BUILD=build/coverage
 LOCK=/tmp/norvik-build.lock
-FOLDERS=(tarsel drawbot ui utility controls)
+# The library's folders: the layers the build knows that exist in this checkout.
+FOLDERS=()
+for f in $(sed -n 's/^set(NORVIK_LAYERS \(.*\))$/\1/p' cmake/NorvikLayers.cmake); do
+  [ -d "$f" ] && FOLDERS+=("$f")
+done
 
 if [ "${1:-}" != "--report" ]; then
   command -v gcovr >/dev/null || bash scripts/install-deps.sh

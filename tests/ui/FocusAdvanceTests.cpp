@@ -1,6 +1,7 @@
 // Focus advance with Tab: order, nesting, wrapping, containers that keep Tab
 // inside, hidden and disabled subtrees, tab weights, the Tab key itself, and
 // host code that changes the tree during the walk.
+#include <cctype>
 #include <functional>
 #include <random>
 #include <string>
@@ -41,86 +42,68 @@ class FocusAdvanceTest : public ::testing::Test {
   boost::intrusive_ptr<test::TestWindowNode> mWindow;
 };
 
-TEST_F(FocusAdvanceTest, TabMovesToTheNextSiblingThatWantsFocus) {
-  FocusableViewP a = AddView(*mWindow, "a");
-  FocusableViewP b = AddView(*mWindow, "b");
-  b->mWantsFocus = false;
-  FocusableViewP c = AddView(*mWindow, "c");
-  ASSERT_TRUE(a->UI_GainKeyboardFocus(kFocusChangeMouse));
-  EXPECT_TRUE(Tab());
-  EXPECT_EQ(FocusLeafID(), "c");
-  EXPECT_TRUE(c->UI_HasKeyboardFocus(true));
-  EXPECT_FALSE(a->UI_HasKeyboardFocus(false));
+// Builds children of inParent from a line such as "a b! panel[c d] e": a name
+// is a focusable view; after it, "!" wants no focus, "~" refuses focus only
+// from Tab and "-" disables the view itself once its children are in. Brackets
+// give children: "[...]" to a panel that never takes focus, "{...}" to a panel
+// that keeps Tab among its children.
+void Build(UI_Node& inParent, const std::string& inSpec, std::size_t& ioAt) {
+  auto at = [&](char inChar) { return ioAt < inSpec.size() && inSpec[ioAt] == inChar; };
+  while (ioAt < inSpec.size() && !at(']') && !at('}')) {
+    if (at(' ')) {
+      ++ioAt;
+      continue;
+    }
+    std::string name;
+    while (ioAt < inSpec.size() && std::isalpha(static_cast<unsigned char>(inSpec[ioAt]))) name += inSpec[ioAt++];
+    const bool panel = at('[') || at('{');
+    FocusableViewP view = panel ? AddPanel(inParent, name) : AddView(inParent, name);
+    if (at('!')) view->mWantsFocus = false;
+    if (at('~')) view->mWantsFocusFromAdvance = false;
+    const bool selfDisabled = at('-');
+    if (at('{')) view->mAllowAdvanceFromChildren = false;
+    if (at('!') || at('~') || at('-')) ++ioAt;
+    if (at('[') || at('{')) {
+      Build(*view, inSpec, ++ioAt);
+      ++ioAt;
+    }
+    if (selfDisabled) view->UI_SetSelfDisabled(true);  // after the children, which stay enabled
+  }
 }
 
-TEST_F(FocusAdvanceTest, ANodeThatOnlyRefusesFocusFromAdvanceIsPassedOver) {
-  FocusableViewP a = AddView(*mWindow, "a");
-  FocusableViewP b = AddView(*mWindow, "b");
-  b->mWantsFocusFromAdvance = false;
-  AddView(*mWindow, "c");
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(FocusLeafID(), "c");
-}
+UI_Node* FindByID(UI_Node& inRoot, const std::string& inID);
 
-TEST_F(FocusAdvanceTest, ForwardFromTheLastChildOfAPanelGoesToThePanelsNextSibling) {
-  AddView(*mWindow, "a");
-  FocusableViewP panel = AddPanel(*mWindow, "panel");
-  AddView(*panel, "b");
-  FocusableViewP c = AddView(*panel, "c");
-  AddView(*mWindow, "d");
-  c->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(FocusLeafID(), "d");
-}
+struct WalkCase {
+  const char* tree;
+  const char* from;
+  bool forward;
+  const char* to;
+};
+const WalkCase kWalks[] = {
+    {"a b! c", "a", true, "c"},                // a node that wants no focus is passed over
+    {"a b~ c", "a", true, "c"},                // so is one that refuses it only from Tab
+    {"a panel[b c] d", "c", true, "d"},        // out of a panel to its next sibling
+    {"a panel[b c]", "b", false, "a"},         // backward out of a panel
+    {"a panel[b] d", "d", true, "a"},          // wrapping at the top, both ways
+    {"a panel[b] d", "a", false, "d"},
+    {"a panel[b] d", "b", false, "a"},
+    {"panel[b c] d", "d", false, "c"},         // backward into a panel lands on its last child
+    {"a panel{b c} d", "c", true, "b"},        // a panel keeping Tab wraps inside itself
+    {"a panel{b c} d", "b", false, "c"},
+    {"a group-[b] d", "a", true, "b"},         // a self-disabled node's children are searched
+};
 
-TEST_F(FocusAdvanceTest, BackwardFromTheFirstChildAsksTheParentBeforeWrapping) {
-  AddView(*mWindow, "a");
-  FocusableViewP panel = AddPanel(*mWindow, "panel");
-  FocusableViewP b = AddView(*panel, "b");
-  AddView(*panel, "c");
-  b->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab(false);
-  EXPECT_EQ(FocusLeafID(), "a");
-}
-
-TEST_F(FocusAdvanceTest, AtTheTopTheWalkWrapsAroundTheWindow) {
-  AddView(*mWindow, "a");
-  FocusableViewP panel = AddPanel(*mWindow, "panel");
-  FocusableViewP b = AddView(*panel, "b");
-  FocusableViewP d = AddView(*mWindow, "d");
-  d->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(FocusLeafID(), "a");
-  Tab(false);
-  EXPECT_EQ(FocusLeafID(), "d");
-  b->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab(false);
-  EXPECT_EQ(FocusLeafID(), "a");
-}
-
-TEST_F(FocusAdvanceTest, BackwardIntoAPanelLandsOnItsLastChild) {
-  FocusableViewP panel = AddPanel(*mWindow, "panel");
-  AddView(*panel, "b");
-  AddView(*panel, "c");
-  FocusableViewP d = AddView(*mWindow, "d");
-  d->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab(false);
-  EXPECT_EQ(FocusLeafID(), "c");
-}
-
-TEST_F(FocusAdvanceTest, AContainerThatKeepsFocusAmongItsChildrenWrapsInsideItself) {
-  AddView(*mWindow, "a");
-  FocusableViewP panel = AddPanel(*mWindow, "panel");
-  panel->mAllowAdvanceFromChildren = false;
-  FocusableViewP b = AddView(*panel, "b");
-  FocusableViewP c = AddView(*panel, "c");
-  AddView(*mWindow, "d");
-  c->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(FocusLeafID(), "b");
-  Tab(false);
-  EXPECT_EQ(FocusLeafID(), "c");
+TEST_F(FocusAdvanceTest, TabWalksTheTreeInDocumentOrderAsEachRowSays) {
+  for (const WalkCase& c : kWalks) {
+    mWindow->DeleteChildren();
+    std::size_t at = 0;
+    Build(*mWindow, c.tree, at);
+    UI_Node* from = FindByID(*mWindow, c.from);
+    ASSERT_TRUE(from && from->UI_GainKeyboardFocus(kFocusChangeMouse)) << c.tree;
+    EXPECT_TRUE(Tab(c.forward)) << c.tree;
+    EXPECT_EQ(FocusLeafID(), c.to) << c.tree << (c.forward ? " forward from " : " backward from ") << c.from;
+    EXPECT_FALSE(from->UI_HasKeyboardFocus(false)) << c.tree;
+  }
 }
 
 TEST_F(FocusAdvanceTest, AHiddenSubtreeIsSearchedButNothingInItGainsFocus) {
@@ -134,17 +117,6 @@ TEST_F(FocusAdvanceTest, AHiddenSubtreeIsSearchedButNothingInItGainsFocus) {
   EXPECT_EQ(FocusLeafID(), "d");
   EXPECT_EQ(b->mPrepareCalls, 1);
   EXPECT_FALSE(b->UI_HasKeyboardFocus(false));
-}
-
-TEST_F(FocusAdvanceTest, ADisabledNodeIsSkippedButItsEnabledChildrenAreSearched) {
-  AddView(*mWindow, "a");
-  FocusableViewP group = AddView(*mWindow, "group");
-  AddView(*group, "b");
-  AddView(*mWindow, "d");
-  group->UI_SetSelfDisabled(true);  // only the group itself: its child stays enabled
-  mWindow->ChildGet(0)->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(FocusLeafID(), "b");
 }
 
 TEST_F(FocusAdvanceTest, ChildrenDisabledThroughTheirAncestorDoNotGainFocus) {

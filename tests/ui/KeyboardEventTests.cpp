@@ -49,24 +49,28 @@ TEST(KeyboardEventForms, CharacterFormWithNoCharactersStillHasOne) {
   EXPECT_EQ(e.GetCharacter(0), 0);
 }
 
-TEST(ShortcutCharacter, LettersOfTheUSLayoutComeOutUpperCase) {
-  EXPECT_EQ(KeyDown('Q', 'q').GetShortcutCharacter(), 'Q');
-  EXPECT_EQ(KeyDown('Q', 0).GetShortcutCharacter(), 0) << "character 0 is its own result";
-}
-
-TEST(ShortcutCharacter, KeysTypingOtherCharactersMapThroughTheLayout) {
-  // Shift+1 types '!', but the shortcut sees the key's own character.
-  EXPECT_EQ(KeyDown('1', '!', ModifierKeys(kModKeyShift)).GetShortcutCharacter(), '1');
-  EXPECT_EQ(KeyDown(191, '?').GetShortcutCharacter(), '/');
-  EXPECT_EQ(KeyDown(-111, '/').GetShortcutCharacter(), '/') << "the extended sign is not part of the key";
-}
-
-TEST(ShortcutCharacter, SomeLetterKeysKeepTheirTypedCharacter) {
-  // These keys are taken as typed, without asking the layout and without case change.
-  EXPECT_EQ(KeyDown('C', 'c').GetShortcutCharacter(), 'c');
-  EXPECT_EQ(KeyDown('V', 'v').GetShortcutCharacter(), 'v');
-  EXPECT_EQ(KeyDown(91, 'x').GetShortcutCharacter(), 'x');
-  EXPECT_EQ(KeyDown('B', 'b').GetShortcutCharacter(), 'B');
+TEST(ShortcutCharacter, IsTheKeysOwnCharacterUpperCasedSaveForKeysTakenAsTyped) {
+  struct Case {
+    short key;
+    unsigned short typed;
+    unsigned char mods;
+    unsigned short shortcut;
+    const char* why;
+  };
+  const Case cases[] = {
+      {'Q', 'q', 0, 'Q', "a letter of the US layout comes out upper case"},
+      {'Q', 0, 0, 0, "character 0 is its own result"},
+      {'1', '!', kModKeyShift, '1', "Shift+1 types '!', the shortcut sees the key's character"},
+      {191, '?', 0, '/', "a key typing another character maps through the layout"},
+      {-111, '/', 0, '/', "the extended sign is not part of the key"},
+      {'C', 'c', 0, 'c', "C is taken as typed"},
+      {'V', 'v', 0, 'v', "V is taken as typed"},
+      {91, 'x', 0, 'x', "key 91 is taken as typed"},
+      {'B', 'b', 0, 'B', "B is not"},
+  };
+  for (const Case& c : cases) {
+    EXPECT_EQ(KeyDown(c.key, c.typed, ModifierKeys(c.mods)).GetShortcutCharacter(), c.shortcut) << c.why;
+  }
 }
 
 TEST(ShortcutCharacter, WithoutAKeyTheCharactersKeyIsLookedUp) {
