@@ -191,7 +191,9 @@ void SurfaceInterface::DrawImage(SupplierInterface const& inSupplier, ImageInter
   Clip(*clip, kFillWinding);
 
   MatrixT<float> place = MatrixT<float>::Translation(inDest.left, inDest.top);
-  bool natural = std::fabs(scaleX - 1.0) <= 1e-12 * std::fabs(scaleX) && std::fabs(scaleY - 1.0) <= 1e-12;
+  // Only the horizontal factor decides: a destination as wide as the source
+  // draws the image at its natural size, clipped to the destination.
+  const bool natural = std::fabs(scaleX - 1.0) <= 1e-12 * std::fabs(scaleX);
   if (natural)
     SetAntiAliasPolicy(kAntiAliasNone);
   else

@@ -57,7 +57,7 @@ TEST(ClipBounds, BisectionProbesLogarithmicallyManyRectangles) {
   EXPECT_LT(surface->mClipProbes, 40);
 }
 
-TEST(ClipBounds, APaintRegionOfSeveralRectanglesIsHonouredExactly) {
+TEST(ClipBounds, APaintRegionIsHonouredExactlyUnlessItsBoundsAreTheWholeTarget) {
   cairo_surface_t* target = cairo_image_surface_create(CAIRO_FORMAT_ARGB32, 200, 200);
   cairo_region_t* region = cairo_region_create();
   cairo_rectangle_int_t a{10, 10, 20, 20}, b{150, 150, 20, 20};
@@ -74,6 +74,15 @@ TEST(ClipBounds, APaintRegionOfSeveralRectanglesIsHonouredExactly) {
     ASSERT_EQ(rects.size(), 2u);
     EXPECT_EQ(rects[0], RectT<long>(10, 10, 20, 20));
   }
+  // Rectangles whose bounds are the whole target are no restriction at all.
+  cairo_rectangle_int_t corner{180, 180, 20, 20}, origin{0, 0, 20, 20};
+  cairo_region_t* spanning = cairo_region_create_rectangle(&origin);
+  cairo_region_union_rectangle(spanning, &corner);
+  {
+    OSSurfaceP surface(NewOSSupplier(), target, spanning);
+    EXPECT_TRUE(surface->IsWithinClipBounds(RectT<long>(50, 50, 50, 50)));
+  }
+  cairo_region_destroy(spanning);
   cairo_region_destroy(region);
   cairo_surface_destroy(target);
 }

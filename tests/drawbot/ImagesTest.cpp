@@ -116,6 +116,12 @@ TEST(DrawImageScaled, AnImageIsScaledIntoItsDestinationAndClippedToIt) {
   EXPECT_EQ(testing::RowCoverage(shot, 2), "..###.....");
   EXPECT_EQ(testing::RowCoverage(shot, 7), ".....###..");
   EXPECT_EQ(testing::RowCoverage(shot, 8), "..........");
+  // The natural-size test looks at the horizontal factor alone: a destination
+  // as wide as the image draws it unscaled, clipped to the destination.
+  PixelCanvas tall(10, 10);
+  tall.GetSurface()->DrawImage(*tall.GetSupplier(), *image, RectT<float>(2, 2, 2, 6), nullptr, 1);
+  EXPECT_EQ(testing::RowCoverage(tall.Snapshot(), 3), "...#......");
+  EXPECT_EQ(testing::RowCoverage(tall.Snapshot(), 5), "..........");
 }
 
 TEST(DrawImageScaled, ASourceRectanglePicksPartOfTheImage) {
@@ -170,6 +176,20 @@ TEST(SurfaceImages, AnOffscreenSurfaceGivesItsPixelsAsAnImage) {
   EXPECT_EQ(canvas.Snapshot().At(0, 0), 0u);
 }
 
+TEST(SurfaceImages, ABufferSurfaceOverTwentyFourBitOrStraightPixelsWritesTheDrawingBack) {
+  unsigned char rgb[8] = {};
+  unsigned char bgra[8] = {};
+  for (auto [layout, data] : {std::pair{kPixelLayoutRGB24, rgb}, std::pair{kPixelLayoutBGRA, bgra}}) {
+    boost::intrusive_ptr<SurfaceInterface> surface(NewOSSupplier()->NewBufferSurface(2, 1, 8, layout, data, nullptr));
+    surface->PaintRect(ColorRGBA(1, 0, 0, 1), RectT<float>(0, 0, 1, 1));
+    surface->PaintRect(ColorRGBA(0, 0, 1, 0.5f), RectT<float>(1, 0, 1, 1));
+    surface->Flush();
+  }
+  EXPECT_EQ(std::vector<int>(rgb, rgb + 6), (std::vector<int>{0, 0, 255, 128, 0, 0})) << "blended over black";
+  EXPECT_EQ(std::vector<int>(bgra, bgra + 8), (std::vector<int>{0, 0, 255, 255, 255, 0, 0, 128}))
+      << "alpha kept straight";
+}
+
 TEST(SurfaceImages, ABufferedSurfaceReachesItsTargetOnFlush) {
   // The image stands in for a window's target: a buffered surface over it
   // draws into memory and copies out on Flush.
@@ -213,9 +233,10 @@ TEST(BufferImages, PixelsWithoutAlphaAreDrawnOpaque) {
   EXPECT_EQ(canvas.Snapshot().At(1, 0), 0xff3c3228u);
   // 32-bit pixels without alpha in rows Cairo cannot wrap are copied, still opaque.
   unsigned char padded[10] = {10, 20, 30, 0, 40, 50, 60, 0, 0, 0};
-  BufferImageP unwrapped(canvas.GetSupplier(), 2, 1, 10, kPixelLayoutRGB32, padded, nullptr);
-  canvas.GetSurface()->DrawImage(*unwrapped, PointT<float>(0, 0), 1);
-  EXPECT_EQ(canvas.Snapshot().At(1, 0), 0xff3c3228u);
+  PixelCanvas fresh(2, 1);
+  BufferImageP unwrapped(fresh.GetSupplier(), 2, 1, 10, kPixelLayoutRGB32, padded, nullptr);
+  fresh.GetSurface()->DrawImage(*unwrapped, PointT<float>(0, 0), 1);
+  EXPECT_EQ(fresh.Snapshot().At(1, 0), 0xff3c3228u);
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include <cairo.h>
 #include <pango/pangocairo.h>
 
+#include <functional>
 #include <map>
 #include <tuple>
 #include <vector>
@@ -234,6 +235,10 @@ class OSSurfaceInterface : public SurfaceInterface {
                      boost::intrusive_ptr<DataDeleter> inDeleter = nullptr);
   ~OSSurfaceInterface() override;
 
+  // For caller's pixels that Cairo cannot draw on in place: called with the
+  // surface drawn on at each Flush and at the end, to copy the pixels back.
+  void SetWriteBack(std::function<void(cairo_surface_t*)> inWriteBack) { mWriteBack = std::move(inWriteBack); }
+
   void PushStateStack() override;
   void PopStateStack() override;
   void PaintRect(ColorRGBA const& inColor, RectT<float> const& inRect) override;
@@ -289,6 +294,7 @@ class OSSurfaceInterface : public SurfaceInterface {
   boost::intrusive_ptr<DataDeleter> mDeleter;
   PangoLayout* mLayout = nullptr;
   int mLayoutPolicies = -1;
+  std::function<void(cairo_surface_t*)> mWriteBack;
   bool mCanGiveImage;
   bool mHasDrawn = false;
   std::vector<State> mStates;

@@ -1,4 +1,5 @@
 // The supplier of the image back end: surfaces, shaders and images.
+#include <algorithm>
 #include <cstring>
 #include <fstream>
 #include <iterator>
@@ -86,6 +87,37 @@ cairo_surface_t* CopyToImage(unsigned long inWidth, unsigned long inHeight, long
   return image;
 }
 
+// The inverse of CopyToImage: premultiplied pixels back into the caller's
+// layout (24-bit, 32-bit without alpha, or straight B, G, R, A).
+void WriteBack(cairo_surface_t* inImage, PixelLayout inLayout, long inRowBytes, unsigned char* outData) {
+  unsigned char const* in = cairo_image_surface_get_data(inImage);
+  const int stride = cairo_image_surface_get_stride(inImage);
+  const int width = cairo_image_surface_get_width(inImage), height = cairo_image_surface_get_height(inImage);
+  for (int y = 0; y < height; ++y) {
+    auto const* src = reinterpret_cast<uint32_t const*>(in + static_cast<std::ptrdiff_t>(y) * stride);
+    unsigned char* dst = outData + static_cast<std::ptrdiff_t>(y) * inRowBytes;
+    for (int x = 0; x < width; ++x) {
+      const uint32_t p = src[x];
+      uint32_t a = p >> 24, r = (p >> 16) & 0xff, g = (p >> 8) & 0xff, b = p & 0xff;
+      if (inLayout == kPixelLayoutRGB24) {
+        dst[3 * x] = static_cast<unsigned char>(b);
+        dst[3 * x + 1] = static_cast<unsigned char>(g);
+        dst[3 * x + 2] = static_cast<unsigned char>(r);
+        continue;
+      }
+      if (inLayout == kPixelLayoutBGRA && a != 0 && a != 255) {
+        auto straight = [a](uint32_t c) { return std::min<uint32_t>(255, (c * 255 + a / 2) / a); };
+        r = straight(r), g = straight(g), b = straight(b);
+      }
+      if (inLayout != kPixelLayoutBGRA) a = dst[4 * x + 3];  // the unused byte stays as it was
+      dst[4 * x] = static_cast<unsigned char>(b);
+      dst[4 * x + 1] = static_cast<unsigned char>(g);
+      dst[4 * x + 2] = static_cast<unsigned char>(r);
+      dst[4 * x + 3] = static_cast<unsigned char>(a);
+    }
+  }
+}
+
 // Cairo can draw these in place: premultiplied B, G, R, A and 32-bit RGB.
 bool CanWrap(PixelLayout inLayout, unsigned long inWidth, long inRowBytes) {
   return (inLayout == kPixelLayoutBGRAPremul || inLayout == kPixelLayoutRGB32) && inRowBytes % 4 == 0 &&
@@ -151,9 +183,22 @@ SurfaceInterface* OSSupplier::NewBufferSurface(unsigned long inWidth, unsigned l
                                                PixelLayout inLayout, void* inData,
                                                boost::intrusive_ptr<DataDeleter> inDeleter) const {
   cairo_format_t format = MapPixelLayout(inLayout);
-  if (!CanWrap(inLayout, inWidth, inRowBytes))
-    ThrowDrawingError("$$$/norvik/drawbot/Error/OSSupplier/UnsupportedPixelFormat=Unsupported Pixel Format.");
-  if (inData == nullptr || inWidth == 0 || inHeight == 0) ThrowDrawingError(kUnableToCreateSurface);
+  if (inData == nullptr || inWidth == 0 || inHeight == 0 || inWidth > 32767 || inHeight > 32767)
+    ThrowDrawingError(kUnableToCreateSurface);
+  if (!CanWrap(inLayout, inWidth, inRowBytes)) {
+    // 24-bit and straight-alpha pixels are drawn on a premultiplied copy that
+    // goes back into the caller's buffer at each flush and at the end.
+    if (inRowBytes < static_cast<long>(inWidth * (inLayout == kPixelLayoutRGB24 ? 3 : 4)))
+      ThrowDrawingError("$$$/norvik/drawbot/Error/OSSupplier/UnsupportedPixelFormat=Unsupported Pixel Format.");
+    cairo_surface_t* copy =
+        CopyToImage(inWidth, inHeight, inRowBytes, inLayout, static_cast<unsigned char const*>(inData));
+    auto* surface = new OSSurfaceInterface(this, copy, true, nullptr, nullptr, std::move(inDeleter));
+    cairo_surface_destroy(copy);
+    surface->SetWriteBack([inLayout, inRowBytes, inData](cairo_surface_t* inDrawn) {
+      WriteBack(inDrawn, inLayout, inRowBytes, static_cast<unsigned char*>(inData));
+    });
+    return surface;
+  }
   cairo_surface_t* image = cairo_image_surface_create_for_data(static_cast<unsigned char*>(inData), format,
                                                                static_cast<int>(inWidth),
                                                                static_cast<int>(inHeight), static_cast<int>(inRowBytes));

@@ -40,6 +40,18 @@ OSSurfaceInterface::OSSurfaceInterface(OSSupplier const* inSupplier, cairo_surfa
     cairo_surface_destroy(mTarget);
     ThrowDrawingError("$$$/norvik/drawbot/Error/OSSupplier/UnableToCreateSurface=Unable to create drawing surface.");
   }
+  // A region whose bounds are the whole visible clip restricts nothing worth
+  // the per-rectangle tests, and is dropped.
+  if (mRegion) {
+    double x1 = 0, y1 = 0, x2 = 0, y2 = 0;
+    cairo_clip_extents(mContext, &x1, &y1, &x2, &y2);
+    cairo_rectangle_int_t bounds;
+    cairo_region_get_extents(mRegion, &bounds);
+    if (bounds.x == x1 && bounds.y == y1 && bounds.x + bounds.width == x2 && bounds.y + bounds.height == y2) {
+      cairo_region_destroy(mRegion);
+      mRegion = nullptr;
+    }
+  }
   if (mRegion) {
     int count = cairo_region_num_rectangles(mRegion);
     for (int i = 0; i < count; ++i) {
@@ -54,6 +66,10 @@ OSSurfaceInterface::OSSurfaceInterface(OSSupplier const* inSupplier, cairo_surfa
 }
 
 OSSurfaceInterface::~OSSurfaceInterface() {
+  if (mWriteBack) {
+    cairo_surface_flush(mTarget);
+    mWriteBack(mTarget);
+  }
   if (mLayout) g_object_unref(mLayout);
   cairo_destroy(mContext);
   if (mOutput) cairo_surface_destroy(mOutput);
@@ -313,6 +329,7 @@ void OSSurfaceInterface::SetTextDisplayPolicy(TextDisplayPolicy inPolicy) {
 
 void OSSurfaceInterface::Flush() {
   cairo_surface_flush(mTarget);
+  if (mWriteBack) mWriteBack(mTarget);
   if (mOutput == nullptr || !mHasDrawn) {
     if (mOutput) cairo_surface_flush(mOutput);
     return;
