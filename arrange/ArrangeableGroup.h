@@ -35,8 +35,6 @@ class AbstractArrangeableGroup : public IArrangeable {
   ArrangementSet& ArrangementsSelf() override { return mSet; }
 
   const std::vector<ISeparator*>& Separators() const { return mSeparators; }
-
- protected:
   // Drops the separators so that the next rebuild asks for new ones.
   void ForgetSeparators();
 
@@ -52,8 +50,11 @@ template <class Arrangement>
 class BasicArrangeableGroup : public AbstractArrangeableGroup {
  public:
   using AbstractArrangeableGroup::AbstractArrangeableGroup;
+  static void AddCandidates(AbstractArrangeableGroup& inGroup, std::vector<ArrangementPtr> const& inChildren) {
+    inGroup.ArrangementsSelf().AddArrangement(new Arrangement(inGroup, inChildren, inGroup.Separators(), true));
+  }
   void AddGroupArrangements(std::vector<ArrangementPtr> const& inChildren) override {
-    ArrangementsSelf().AddArrangement(new Arrangement(*this, inChildren, Separators(), true));
+    AddCandidates(*this, inChildren);
   }
 };
 

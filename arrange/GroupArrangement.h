@@ -26,6 +26,7 @@ class GroupArrangement : public IArrangement {
   void Prepare() override;
   bool IsGroupLevel() const override { return mGroupLevel; }
   bool Dominates(IArrangement const& inOther) const override;
+  std::uint64_t Signature() const override { return mSignature; }
   virtual void ComputeNaturalWidth();
   virtual void ComputeNaturalHeight();
 
@@ -65,6 +66,7 @@ class GroupArrangement : public IArrangement {
   bool mGroupLevel;
   bool mHorizontallyExpandable = false, mVerticallyExpandable = false;
   bool mPrepared = false;
+  std::uint64_t mSignature = 0;
 };
 
 class RowArrangement : public GroupArrangement {

@@ -38,6 +38,9 @@ class IArrangeable {
   bool ArrangementEnabled() const;
 
   bool IsBuilt() const { return mBuilt; }
+  // Takes the root state (last rectangle, enabled flag) of an element that
+  // this one replaces in the tree.
+  void TakeOverFrom(IArrangeable const& inReplaced);
   RectF LastRectangle() const { return mLastRect; }
 
  protected:
@@ -54,6 +57,8 @@ class IArrangeable {
   bool mBuilt = false;
   bool mArrangementEnabled = true;
   bool mArranging = false;  // at a root: a placement is running
+  bool mPlaced = false;     // at a root: the last placement finished built
+  PointF mLastUsed;
   RectF mLastRect;
   IArrangeable* mParent = nullptr;
 };

@@ -10,6 +10,8 @@
 // can never be picked and is dropped; the set keeps one representative. A
 // looser rule (comparing minimum sizes only, say) would be wrong: a candidate
 // that needs more room may still waste less of a large rectangle.
+#include <cstdint>
+#include <unordered_map>
 #include <vector>
 
 #include <boost/intrusive_ptr.hpp>
@@ -37,6 +39,9 @@ class IArrangement : public tarsel::utility::RefCountedObject {
   virtual bool IsGroupLevel() const = 0;
   // See the paragraph on dominance above.
   virtual bool Dominates(IArrangement const& inOther) const = 0;
+  // Equal for any two candidates of which one dominates the other, so that
+  // the set compares only candidates that share it.
+  virtual std::uint64_t Signature() const { return 0; }
 };
 
 using ArrangementPtr = boost::intrusive_ptr<IArrangement>;
@@ -44,13 +49,21 @@ using ArrangementPtr = boost::intrusive_ptr<IArrangement>;
 class ArrangementSet : public std::vector<ArrangementPtr> {
  public:
   // Adds a candidate unless a member already has its merit; a null pointer is
-  // ignored. Returns whether the candidate was kept.
+  // ignored. Returns whether the candidate was kept. Only members with the
+  // candidate's signature are compared.
   bool AddArrangement(ArrangementPtr inArrangement);
+  void clear();
 
   // The candidate the choice rule picks for a size; null for an empty set.
   IArrangement* ChooseFor(PointF const& inSize) const;
   // The candidate nearest the golden ratio in natural size, the first on a tie.
   IArrangement* MostBalanced() const;
+
+ private:
+  void Reindex();
+
+  std::unordered_multimap<std::uint64_t, ArrangementPtr> mBySignature;
+  std::size_t mIndexed = 0;
 };
 
 // True when the challenger beats the current best at a size. Ties keep the best.

@@ -58,6 +58,7 @@ class SingleArrangement : public IArrangement {
   float ExpandedHeight(float inHeight) const override;
   bool IsGroupLevel() const override { return false; }
   bool Dominates(IArrangement const& inOther) const override;
+  std::uint64_t Signature() const override { return reinterpret_cast<std::uintptr_t>(mSingle.get()); }
 
  private:
   std::shared_ptr<Single*> mSingle;

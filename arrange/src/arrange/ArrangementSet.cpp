@@ -1,5 +1,6 @@
 #include <algorithm>
 #include <cmath>
+#include <cstring>
 #include <limits>
 
 #include "arrange/IArrangement.h"
@@ -45,14 +46,37 @@ bool Beats(IArrangement& inChallenger, IArrangement& inBest, PointF const& inSiz
   return GoldenDistance(inChallenger) < GoldenDistance(inBest);
 }
 
+void ArrangementSet::clear() {
+  std::vector<ArrangementPtr>::clear();
+  mBySignature.clear();
+  mIndexed = 0;
+}
+
+void ArrangementSet::Reindex() {
+  mBySignature.clear();
+  for (const ArrangementPtr& member : *this) mBySignature.emplace(member->Signature(), member);
+  mIndexed = size();
+}
+
 bool ArrangementSet::AddArrangement(ArrangementPtr inArrangement) {
   if (!inArrangement) return false;
-  for (const ArrangementPtr& member : *this)
-    if (member->Dominates(*inArrangement)) return false;
-  erase(std::remove_if(begin(), end(),
-                       [&](const ArrangementPtr& inMember) { return inArrangement->Dominates(*inMember); }),
-        end());
+  if (mIndexed != size()) Reindex();  // members were added past this function
+  const std::uint64_t key = inArrangement->Signature();
+  auto [first, last] = mBySignature.equal_range(key);
+  bool removed = false;
+  for (auto it = first; it != last; ++it) {
+    if (it->second->Dominates(*inArrangement)) return false;
+    removed = removed || inArrangement->Dominates(*it->second);
+  }
+  if (removed) {
+    erase(std::remove_if(begin(), end(),
+                         [&](const ArrangementPtr& inMember) { return inArrangement->Dominates(*inMember); }),
+          end());
+    Reindex();
+  }
+  mBySignature.emplace(key, inArrangement);
   push_back(std::move(inArrangement));
+  mIndexed = size();
   return true;
 }
 

@@ -14,6 +14,9 @@ GroupArrangement::GroupArrangement(AbstractArrangeableGroup& inGroup, std::vecto
   mSeparators.resize(mChildren.empty() ? 0 : mChildren.size() - 1, nullptr);
   ReadGroup();
   ComputeMinimum();
+  std::uint64_t signature = reinterpret_cast<std::uintptr_t>(mGroup) * 31 + (mAxis.vertical ? 7 : 3) + mGroupLevel;
+  for (const ArrangementPtr& child : mChildren) signature = signature * 1099511628211ull ^ child->Signature();
+  mSignature = signature;
 }
 
 // The group's properties are read once: every setter of a group invalidates

@@ -75,7 +75,10 @@ PointF IArrangeable::ArrangeAtRoot(RectF const& inRect) {
   if (!(inRect.width > 0.0f) || !(inRect.height > 0.0f) || !mArrangementEnabled) return {0.0f, 0.0f};
   RectF rect(SaneCoordinate(inRect.left), SaneCoordinate(inRect.top), SaneExtent(inRect.width),
              SaneExtent(inRect.height));
+  // Nothing has been invalidated since the same rectangle was placed.
+  if (mBuilt && mPlaced && rect == mLastRect) return mLastUsed;
   mLastRect = rect;
+  mPlaced = false;
   // A placement that re-enters (a child invalidating from its Place) is left
   // to the running loop, which sees the cleared flag and goes round again.
   if (mArranging) return {0.0f, 0.0f};
@@ -88,6 +91,8 @@ PointF IArrangeable::ArrangeAtRoot(RectF const& inRect) {
     used = chosen->Arrange(rect);
     if (mBuilt) break;
   }
+  mPlaced = mBuilt;
+  mLastUsed = used;
   return used;
 }
 
@@ -120,6 +125,11 @@ void IArrangeable::EnableArrangement(bool inEnable) {
   if (root.mArrangementEnabled == inEnable) return;
   root.mArrangementEnabled = inEnable;
   if (inEnable) root.Arrange(root.mLastRect);
+}
+
+void IArrangeable::TakeOverFrom(IArrangeable const& inReplaced) {
+  mLastRect = inReplaced.mLastRect;
+  mArrangementEnabled = inReplaced.mArrangementEnabled;
 }
 
 bool IArrangeable::ArrangementEnabled() const { return Root().mArrangementEnabled; }
