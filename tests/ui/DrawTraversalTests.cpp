@@ -83,8 +83,20 @@ TEST_F(DrawTraversal, AChildOutsideTheClipIsSkippedBeforeItsSubtreeIsVisited) {
   auto outside = AddPaintingView("outside", 60, 60, 30, 30, 3, &log, root.get());
   AddPaintingView("under-outside", 0, 0, 5, 5, 3, &log, outside.get());
   auto straddling = AddPaintingView("straddling", 39, 0, 20, 20, 3, &log, root.get());
+  AddPaintingView("half-in", 39.5f, 39.5f, 5, 5, 3, &log, root.get());
+  AddPaintingView("scaled-in", 19, 19, 5, 5, 3, &log, root.get())->UI_SetMatrix(UI_Node::Matrix(2, 2, 0, 0));
+  AddPaintingView("scaled-out", 20, 20, 5, 5, 3, &log, root.get())->UI_SetMatrix(UI_Node::Matrix(2, 2, 0, 0));
   Paint();
-  EXPECT_EQ(log, (Strings{"inside", "straddling"}));
+  EXPECT_EQ(log, (Strings{"inside", "straddling", "half-in", "scaled-in"}));
+}
+
+TEST_F(DrawTraversal, ASmallClipOverAWidePanelAsksTheSurfaceAboutNearbyChildrenOnly) {
+  for (int i = 0; i < 400; ++i)
+    AddPaintingView("cell", static_cast<float>(i % 20) * 5, static_cast<float>(i / 20) * 5, 4, 4, 3, &log, root.get());
+  target.surface->SetClipRects({tarsel::geom::RectT<long>(50, 50, 4, 4)});
+  Paint();
+  EXPECT_EQ(log.size(), 1u);
+  EXPECT_LE(target.surface->mClipProbes, 10);
 }
 
 TEST_F(DrawTraversal, ARootOutsideTheClipDrawsNothing) {

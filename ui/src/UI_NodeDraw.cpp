@@ -1,5 +1,6 @@
 // The draw traversal: from a drawing root through the children, each node
 // drawn directly or through its cached rendering.
+#include <algorithm>
 #include <cmath>
 #include <optional>
 #include <vector>
@@ -35,6 +36,26 @@ ThemeStamp CurrentThemeStamp(const UI_Node& inNode) {
   return stamp;
 }
 
+// False only when the child cannot pass the clip test of the full dispatch.
+// The test is made in the parent's coordinates, on floats, with a margin of
+// two child units and a pixel: the full test rounds the child's rectangle and
+// the clip in the child's coordinates outwards, each by less than a unit.
+bool MayTouchClip(const UI_Node& inChild, const UI_Node::RectL& inClip) {
+  if (inChild.UI_ReceivesEventsFromOS() || !inChild.UI_IsShown()) return false;
+  const UI_Node::Matrix m = inChild.UI_GetSelfToParentMatrix();
+  if (!(std::fabs(m.sx) > kMinimumScale) || !(std::fabs(m.sy) > kMinimumScale)) return false;
+  const UI_Node::RectF local = inChild.UI_GetLocalRectF(false);
+  const double sx = m.sx, sy = m.sy;
+  const double x1 = local.left * sx + m.tx, x2 = local.Right() * sx + m.tx;
+  const double y1 = local.top * sy + m.ty, y2 = local.Bottom() * sy + m.ty;
+  const double mx = 2 * std::fabs(sx) + 1, my = 2 * std::fabs(sy) + 1;
+  // Written so that a NaN anywhere keeps the child for the full test.
+  return !(std::min(x1, x2) >= static_cast<double>(inClip.Right()) + mx ||
+           std::max(x1, x2) <= static_cast<double>(inClip.left) - mx ||
+           std::min(y1, y2) >= static_cast<double>(inClip.Bottom()) + my ||
+           std::max(y1, y2) <= static_cast<double>(inClip.top) - my);
+}
+
 }  // namespace
 
 void UI_Node::UI_Draw(drawbot::Drawbot* inDrawbot) { UI_DispatchDrawToChildren(inDrawbot); }
@@ -54,9 +75,20 @@ bool UI_Node::UI_UseDrawbotCache(drawbot::Drawbot* inDrawbot) const {
 
 void UI_Node::UI_DispatchDrawToChildren(drawbot::Drawbot* inDrawbot) {
   UI_NodeProtector protector(this);
-  // A copy with strong references: a child's drawing may remove siblings.
-  const std::vector<UI_NodeP> children(mChildren.begin(), mChildren.end());
-  for (const UI_NodeP& child : children) {
+  drawbot::SurfaceInterface* surface = inDrawbot ? inDrawbot->GetSurface() : nullptr;
+  if (!surface) return;
+  // A small repaint of a wide node must not pay a surface save, transform and
+  // clip query for every child: children are first rejected against the clip
+  // in this node's own integer coordinates, and only the rest are kept, with
+  // strong references, since a child's drawing may remove siblings.
+  const RectL clip = surface->GetClipBounds();
+  if (clip.IsEmpty()) return;
+  std::vector<UI_NodeP> drawn;
+  for (std::size_t i = 0; i < mChildren.size(); ++i) {
+    UI_Node* child = mChildren[i].get();
+    if (MayTouchClip(*child, clip)) drawn.emplace_back(child);
+  }
+  for (const UI_NodeP& child : drawn) {
     if (child->UI_GetParentContainer() != this) continue;
     UI_DispatchDrawToChild(child.get(), inDrawbot);
   }
