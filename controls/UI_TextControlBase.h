@@ -47,4 +47,15 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
 // The width of inText in the record's font, or 0 without a font.
 float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF16String& inLabel);
 
+// The block inLabel fills: wrapped at inWidth (its width, and the height of
+// the wrapped lines), or with inWidth not above 0 on one line (its width and
+// that line's height). One line measures the same either way, so a caller can
+// compare the two heights to learn whether the text wraps.
+tarsel::geom::PointT<float> MeasureControlLabelBlock(const DrawTextControlBaseParameters& inText,
+                                                     const UTF16String& inLabel, float inWidth);
+
+// Draws the label wrapped at inRect's width from its top, clipped to it.
+void DrawControlLabelLines(const DrawParameters& inParams, const DrawTextControlBaseParameters& inText,
+                           const tarsel::geom::RectT<float>& inRect, drawbot::Drawbot& inDrawbot);
+
 }  // namespace norvik::controls

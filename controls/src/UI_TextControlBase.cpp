@@ -88,14 +88,45 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
 // Labels are measured before any window paints them (a layout asks for
 // recommended sizes first), so without a supplier installed in the manager
 // the platform back end's own one measures them.
-float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF16String& inLabel) {
-  if (inLabel.empty()) return 0;
+namespace {
+const drawbot::SupplierInterface* MeasuringSupplier() {
   const ui::UI_NodeManager* manager = ui::UI_NodeManager::GetConst();
   const drawbot::SupplierInterface* supplier = manager ? manager->GetOSDrawSupplier() : nullptr;
-  if (!supplier) supplier = drawbot::NewOSSupplier();
+  return supplier ? supplier : drawbot::NewOSSupplier();
+}
+}  // namespace
+
+float MeasureControlLabel(const DrawTextControlBaseParameters& inText, const UTF16String& inLabel) {
+  if (inLabel.empty()) return 0;
+  const drawbot::SupplierInterface* supplier = MeasuringSupplier();
   if (!supplier) return 0;
   drawbot::FontP font = LabelFont(supplier, inText);
   return font ? font->MeasureStringWidth(Chars(inLabel), static_cast<long>(inLabel.size())) : 0;
+}
+
+tarsel::geom::PointT<float> MeasureControlLabelBlock(const DrawTextControlBaseParameters& inText,
+                                                     const UTF16String& inLabel, float inWidth) {
+  const bool wraps = std::isfinite(inWidth) && inWidth > 0;
+  if (inLabel.empty()) return {wraps ? inWidth : 0.0f, 0.0f};
+  const drawbot::SupplierInterface* supplier = MeasuringSupplier();
+  drawbot::FontP font = supplier ? LabelFont(supplier, inText) : drawbot::FontP();
+  if (!font) return {0.0f, 0.0f};
+  const long length = static_cast<long>(inLabel.size());
+  const float height = font->MeasureMultiLineStringHeight(Chars(inLabel), wraps ? inWidth : 0.0f, length);
+  return {wraps ? inWidth : font->MeasureStringWidth(Chars(inLabel), length), height};
+}
+
+void DrawControlLabelLines(const DrawParameters& inParams, const DrawTextControlBaseParameters& inText,
+                           const tarsel::geom::RectT<float>& inRect, drawbot::Drawbot& inDrawbot) {
+  const UTF16String& text = inText.GetText();
+  const drawbot::SupplierInterface* supplier = inDrawbot.GetSupplier();
+  drawbot::SurfaceInterface* surface = inDrawbot.GetSurface();
+  if (text.empty() || !supplier || !surface || inRect.IsEmpty() || !supplier->SupportsFonts()) return;
+  drawbot::FontP font = LabelFont(supplier, inText);
+  const bool disabled = inParams.GetControlState().Test(UI_ControlView::kStateDisabled);
+  drawbot::BrushP brush(supplier, LabelColor(inParams, disabled));
+  if (!font || !brush) return;
+  surface->DrawMultiLineString(*brush, *font, Chars(text), inRect, inText.GetTextAlignment());
 }
 
 }  // namespace norvik::controls
