@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 
 #include "support/ui/HeadlessTestSupport.h"
+#include "support/ui/KeyCodes.h"
 
 namespace norvik::ui::test {
 namespace {
@@ -12,7 +13,6 @@ using ::testing::ElementsAre;
 constexpr int kKeyA = 'A';
 constexpr int kKeyC = 'C';
 constexpr int kKeyX = 'X';
-constexpr int kKeyLeftArrow = 37;
 
 class HeadlessInputTest : public HeadlessFixture {
  protected:
@@ -340,8 +340,8 @@ TEST_F(HeadlessKeyTest, AHeldKeyRepeatsWithThePreviousStateBitSet) {
 }
 
 TEST_F(HeadlessKeyTest, TheExtendedFlagIsBitTwentyFour) {
-  mSystem.TypeKey(kKeyLeftArrow, true);
-  mSystem.TypeKey(kKeyLeftArrow, false);
+  mSystem.TypeKey(keys::kLeft, true);
+  mSystem.TypeKey(keys::kLeft, false);
   mSystem.Pump();
   const auto downs = Messages(kOSMsgKeyDown);
   ASSERT_EQ(downs.size(), 2u);

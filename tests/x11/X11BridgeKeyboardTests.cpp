@@ -3,6 +3,7 @@
 // and the keyboard layout in force deciding which key a character came from.
 #include <xkbcommon/xkbcommon-keysyms.h>
 
+#include "support/ui/KeyCodes.h"
 #include "x11/X11BridgeFixture.h"
 
 namespace norvik::test {
@@ -10,8 +11,6 @@ namespace {
 
 using namespace norvik::ui;
 
-constexpr short kKeyTab = 9;
-constexpr short kKeyShift = 16;
 constexpr short kKeyOne = '1';
 
 class X11BridgeKeyboard : public X11BridgeTest {
@@ -51,7 +50,7 @@ TEST_F(X11BridgeKeyboard, TypedKeysReachTheFocusedNodeWithCodesAndCharacters) {
   const auto downs = mFirst->Actions(KeyboardEvent::kActionKeyDown);
   ASSERT_EQ(downs.size(), 3u);
   EXPECT_EQ(downs[0].GetOSCode(), 'A');
-  EXPECT_EQ(downs[1].GetOSCode(), kKeyShift);
+  EXPECT_EQ(downs[1].GetOSCode(), ui::test::keys::kShift);
   EXPECT_EQ(downs[2].GetOSCode(), kKeyOne);
   EXPECT_TRUE(downs[2].GetModKey().Test(kModKeyShift));
   EXPECT_FALSE(downs[0].GetModKey().Test(kModKeyShift));
