@@ -13,6 +13,7 @@
 #include "drawbot/BasicSurfaceReferenceInterface.h"
 #include "drawbot/SupplierInterface.h"
 #include "drawbot/SurfaceInterface.h"
+#include "drawbot/src/cairo/PixelBoxes.h"
 
 namespace norvik::drawbot::cairo {
 
@@ -117,6 +118,8 @@ class OSPathInterface : public PathInterface {
   void ClosePath() override;
 
   bool IsPixelAligned() const { return mPixelAligned; }
+  // True, with x, y, width and height, when the path is one rectangle and nothing else.
+  bool GetSingleRect(double (&outRect)[4]) const;
   // Replays the path onto the context's current path, in its user space.
   void Build(cairo_t* inContext) const;
 
@@ -280,6 +283,8 @@ class OSSurfaceInterface : public SurfaceInterface {
     AntiAliasPolicy antiAlias = kAntiAliasNone;
     InterpolationPolicy interpolation = kInterpolationNearestNeighbor;
     TextDisplayPolicy textDisplay = kTextDisplayGridFitted;
+    // The clip as whole device pixels, when it is a few boxes.
+    ClipBoxes clip;
   };
   // Saves the context and moves it to whole-pixel centres when the shape stays
   // on whole pixels with anti-aliasing off; see the source for why.

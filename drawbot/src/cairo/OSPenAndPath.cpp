@@ -70,6 +70,12 @@ void OSPathInterface::Rect(double inX, double inY, double inW, double inH) {
   mFirstY = mCurrentY = inY;
 }
 
+bool OSPathInterface::GetSingleRect(double (&outRect)[4]) const {
+  if (mSegments.size() != 1 || mSegments[0].op != Op::kRect) return false;
+  for (int i = 0; i < 4; ++i) outRect[i] = mSegments[0].v[i];
+  return true;
+}
+
 void OSPathInterface::MoveTo(PointT<long> const& inPoint) { Move(inPoint.x, inPoint.y); }
 void OSPathInterface::MoveTo(PointT<float> const& inPoint) {
   mPixelAligned = false;

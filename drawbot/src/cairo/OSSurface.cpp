@@ -63,6 +63,8 @@ OSSurfaceInterface::OSSurfaceInterface(OSSupplier const* inSupplier, cairo_surfa
     cairo_clip(mContext);
   }
   mStates.emplace_back();
+  mStates.back().clip = ClipBoxes::ForTarget(mTarget);
+  if (mRegion) mStates.back().clip.IntersectRegion(mRegion);
 }
 
 OSSurfaceInterface::~OSSurfaceInterface() {
@@ -113,6 +115,14 @@ void OSSurfaceInterface::PaintRect(ColorRGBA const& inColor, RectT<float> const&
   // it only sets what every other operation sets for itself anyway.
   double left = std::floor(inRect.left), top = std::floor(inRect.top);
   double right = std::ceil(inRect.Right()), bottom = std::ceil(inRect.Bottom());
+  // An opaque box on whole device pixels inside a box clip is written
+  // directly: the same pixels as the fill below, at a fraction of its cost.
+  ClipBoxes::Box box;
+  if (DeviceBoxOf(mContext, left, top, right - left, bottom - top, &box) &&
+      FillOpaqueBox(mTarget, mStates.back().clip, box, inColor)) {
+    mHasDrawn = true;
+    return;
+  }
   cairo_set_antialias(mContext, MapAntiAlias(mStates.back().antiAlias));
   cairo_set_operator(mContext, CAIRO_OPERATOR_OVER);
   SetSourceColor(mContext, inColor);
@@ -182,6 +192,13 @@ void OSSurfaceInterface::Clip(PathInterface const& inPath, FillType inFill) {
   path.Build(mContext);
   cairo_clip(mContext);
   cairo_set_antialias(mContext, previous);
+  ClipBoxes& clip = mStates.back().clip;
+  double rect[4];
+  ClipBoxes::Box box;
+  if (clip.count >= 0 && path.GetSingleRect(rect) && DeviceBoxOf(mContext, rect[0], rect[1], rect[2], rect[3], &box))
+    clip.Intersect(box);
+  else
+    clip.count = -1;
 }
 
 RectT<long> OSSurfaceInterface::GetClipBounds() {
