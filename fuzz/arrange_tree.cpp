@@ -1,6 +1,7 @@
 // Builds an arrangement tree from arbitrary bytes (group kinds, leaf sizes
 // including NaN, infinite and negative values, margins, the rectangle) and
 // checks that no leaf is ever placed with a NaN or infinite coordinate.
+#include <algorithm>
 #include <cmath>
 #include <cstdint>
 #include <cstdlib>
@@ -65,12 +66,16 @@ class Group : public DefaultGroup<DynamicGroup> {
       if (!inVisitor(*child)) return false;
     return true;
   }
+  void ChildDestroyed(IArrangeable& inChild) override {
+    children.erase(std::remove(children.begin(), children.end(), &inChild), children.end());
+  }
   std::vector<IArrangeable*> children;
 };
 
+// Leaves go first, each leaving its group; then the groups, outer first.
 struct Tree {
+  std::vector<std::unique_ptr<Group>> groups;
   std::vector<std::unique_ptr<Leaf>> leaves;
-  std::vector<std::unique_ptr<Group>> groups;  // parents before children: destroyed children first
 };
 
 // Wrapping groups grow as 2^(n-1) candidates and products multiply them,
@@ -108,6 +113,5 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* inData, size_t inSize) {
   root.Arrange(RectF(bytes.Extent(), bytes.Extent(), bytes.Extent(), bytes.Extent()));
   root.BestSize();
   root.Arrange(RectF(0, 0, bytes.Extent(), bytes.Extent()));
-  for (auto& group : tree.groups) group->children.clear();  // no walks while the tree comes down
   return 0;
 }
