@@ -43,7 +43,7 @@ class CutBuilder {
     ArrangementPtr& line = mLines[{inBegin, inEnd}];
     if (!line) {
       std::vector<ArrangementPtr> children(mChildren.begin() + inBegin, mChildren.begin() + inEnd);
-      std::vector<ISeparator*> separators(mSeparators.begin() + inBegin, mSeparators.begin() + inEnd - 1);
+      std::vector<ISeparator*> separators(mSeparators.begin() + inBegin, mSeparators.begin() + (inEnd - 1));
       line = MakeGroup(mGroup, mLineAxis, children, separators, false);
     }
     return line;
