@@ -39,6 +39,9 @@ targets=()
 for name in "${names[@]}"; do targets+=("fuzz_$name"); done
 cmake --build "$build" -j2 --target "${targets[@]}"
 
+# The font libraries' process-wide caches are never freed, as in the test suite.
+export LSAN_OPTIONS="suppressions=$root/tests/lsan.supp:print_suppressions=0"
+
 failed=()
 for name in "${names[@]}"; do
   work="$build/fuzz-runs/$name"

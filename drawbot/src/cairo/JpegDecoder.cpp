@@ -10,6 +10,10 @@ namespace norvik::drawbot {
 
 namespace {
 
+// 8192 x 8192: far above any picture of the toolkit, far below what would
+// exhaust memory.
+constexpr std::uint64_t kMaxPixels = std::uint64_t(1) << 26;
+
 // The library reports a fatal error by calling error_exit, which must not
 // return; control goes back to the decoder through the jump buffer, since an
 // exception may not cross the library's C frames.
@@ -48,6 +52,11 @@ bool Run(Decoding& ioState, unsigned char const* inData, std::size_t inSize) {
   jpeg_create_decompress(&info);
   jpeg_mem_src(&info, inData, static_cast<unsigned long>(inSize));
   if (jpeg_read_header(&info, TRUE) != JPEG_HEADER_OK) return false;
+  // The header's size is checked before the library allocates for it: a few
+  // bytes may claim an image of gigabytes.
+  if (info.image_width == 0 || info.image_height == 0 || info.image_width > 32767 || info.image_height > 32767 ||
+      std::uint64_t(info.image_width) * info.image_height > kMaxPixels)
+    return false;
   // Grey, RGB and YCbCr all come out as RGB; CMYK files are refused here.
   info.out_color_space = JCS_RGB;
   jpeg_start_decompress(&info);
