@@ -33,17 +33,38 @@ float IArrangement::WastedArea(PointF const& inSize) const {
   return inSize.x * inSize.y - ExpandedWidth(inSize.x) * ExpandedHeight(inSize.y);
 }
 
+// What the choice rule reads of one candidate at one size, each measure
+// taken once: a walk over many candidates then measures each of them once.
+struct Merit {
+  bool fits;
+  float loss;  // the wasted area when it fits, else the overflowing area
+  float area;
+  float golden;
+};
+
+static Merit MeritOf(IArrangement& inArrangement, PointF const& inSize) {
+  Merit merit{Fits(inArrangement, inSize), 0.0f, 0.0f, 0.0f};
+  if (!merit.fits) {
+    merit.loss = inArrangement.OverflowArea(inSize);
+    return merit;
+  }
+  merit.loss = inArrangement.WastedArea(inSize);
+  merit.area = inArrangement.MinWidth() * inArrangement.MinHeight();
+  merit.golden = GoldenDistance(inArrangement);
+  return merit;
+}
+
+// Of two candidates that overflow, only the overflow counts; a tie keeps the best.
+static bool Better(Merit const& inChallenger, Merit const& inBest) {
+  if (inChallenger.fits != inBest.fits) return inChallenger.fits;
+  if (inChallenger.loss != inBest.loss) return inChallenger.loss < inBest.loss;
+  if (!inChallenger.fits) return false;
+  if (inChallenger.area != inBest.area) return inChallenger.area < inBest.area;
+  return inChallenger.golden < inBest.golden;
+}
+
 bool Beats(IArrangement& inChallenger, IArrangement& inBest, PointF const& inSize) {
-  const bool challengerFits = Fits(inChallenger, inSize);
-  if (challengerFits != Fits(inBest, inSize)) return challengerFits;
-  if (!challengerFits) return inChallenger.OverflowArea(inSize) < inBest.OverflowArea(inSize);
-  const float challengerWaste = inChallenger.WastedArea(inSize);
-  const float bestWaste = inBest.WastedArea(inSize);
-  if (challengerWaste != bestWaste) return challengerWaste < bestWaste;
-  const float challengerArea = inChallenger.MinWidth() * inChallenger.MinHeight();
-  const float bestArea = inBest.MinWidth() * inBest.MinHeight();
-  if (challengerArea != bestArea) return challengerArea < bestArea;
-  return GoldenDistance(inChallenger) < GoldenDistance(inBest);
+  return Better(MeritOf(inChallenger, inSize), MeritOf(inBest, inSize));
 }
 
 void ArrangementSet::clear() {
@@ -84,9 +105,13 @@ IArrangement* ArrangementSet::ChooseFor(PointF const& inSize) const {
   if (empty()) return nullptr;
   IArrangement* best = front().get();
   best->Prepare();
+  Merit bestMerit = MeritOf(*best, inSize);
   for (auto it = begin() + 1; it != end(); ++it) {
     (*it)->Prepare();
-    if (Beats(**it, *best, inSize)) best = it->get();
+    const Merit merit = MeritOf(**it, inSize);
+    if (!Better(merit, bestMerit)) continue;
+    best = it->get();
+    bestMerit = merit;
   }
   return best;
 }
