@@ -13,6 +13,7 @@
 #include "drawbot/BasicSurfaceReferenceInterface.h"
 #include "drawbot/SupplierInterface.h"
 #include "drawbot/SurfaceInterface.h"
+#include "drawbot/src/cairo/LayoutCache.h"
 #include "drawbot/src/cairo/PixelBoxes.h"
 
 namespace norvik::drawbot::cairo {
@@ -219,6 +220,8 @@ class OSSupplier : public SupplierInterface {
 
   // The layout that measures text without any paint in progress.
   PangoLayout* GetMeasuringLayout() const { return mMeasuringLayout; }
+  // The shaped layouts that surfaces draw and measure text with.
+  LayoutCache& GetLayoutCache() const { return mLayoutCache; }
 
  private:
   using FontKey = std::tuple<std::u16string, int, float>;
@@ -226,6 +229,8 @@ class OSSupplier : public SupplierInterface {
   cairo_t* mMeasuringContext = nullptr;
   PangoLayout* mMeasuringLayout = nullptr;
   mutable std::map<FontKey, boost::intrusive_ptr<OSFontInterface>> mFontCache;
+  // After the fonts: its entries hold references on them.
+  mutable LayoutCache mLayoutCache;
 };
 
 // A surface over a Cairo image surface or a platform target.
@@ -290,15 +295,15 @@ class OSSurfaceInterface : public SurfaceInterface {
   // on whole pixels with anti-aliasing off; see the source for why.
   void BeginDrawing(bool inPixelAligned);
   void EndDrawing();
-  PangoLayout* PrepareLayout(FontInterface const& inFont);
+  // The supplier's cached layout of inText under this state's text policies.
+  PangoLayout* CachedLayout(FontInterface const& inFont, std::string const& inText, int inWidth,
+                            TextAlignment inAlignment);
 
   cairo_surface_t* mTarget;
   cairo_t* mContext;
   cairo_surface_t* mOutput;
   cairo_region_t* mRegion;
   boost::intrusive_ptr<DataDeleter> mDeleter;
-  PangoLayout* mLayout = nullptr;
-  int mLayoutPolicies = -1;
   std::function<void(cairo_surface_t*)> mWriteBack;
   bool mCanGiveImage;
   bool mHasDrawn = false;

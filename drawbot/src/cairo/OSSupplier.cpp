@@ -137,6 +137,7 @@ OSSupplier::OSSupplier() {
 }
 
 OSSupplier::~OSSupplier() {
+  mLayoutCache.Clear();
   mFontCache.clear();
   g_object_unref(mMeasuringLayout);
   cairo_destroy(mMeasuringContext);

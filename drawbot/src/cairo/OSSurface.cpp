@@ -72,7 +72,6 @@ OSSurfaceInterface::~OSSurfaceInterface() {
     cairo_surface_flush(mTarget);
     mWriteBack(mTarget);
   }
-  if (mLayout) g_object_unref(mLayout);
   cairo_destroy(mContext);
   if (mOutput) cairo_surface_destroy(mOutput);
   if (mRegion) cairo_region_destroy(mRegion);
@@ -234,18 +233,11 @@ void OSSurfaceInterface::GetTransform(MatrixT<float>* outMatrix) const {
   *outMatrix = FromCairo(m);
 }
 
-PangoLayout* OSSurfaceInterface::PrepareLayout(FontInterface const& inFont) {
-  auto const& font = Cast<OSFontInterface>(inFont);
-  if (mLayout == nullptr) mLayout = pango_cairo_create_layout(mContext);
-  pango_cairo_update_layout(mContext, mLayout);
-  // Changing font options makes Pango lay out again; do it only when the policies change.
-  int policies = mStates.back().antiAlias * 4 + mStates.back().textDisplay;
-  if (policies != mLayoutPolicies) {
-    ApplyTextPolicies(mLayout, mStates.back().antiAlias, mStates.back().textDisplay);
-    mLayoutPolicies = policies;
-  }
-  pango_layout_set_font_description(mLayout, font.GetDescription());
-  return mLayout;
+PangoLayout* OSSurfaceInterface::CachedLayout(FontInterface const& inFont, std::string const& inText, int inWidth,
+                                               TextAlignment inAlignment) {
+  auto const* supplier = static_cast<OSSupplier const*>(GetSupplier());
+  return supplier->GetLayoutCache().Get(mContext, Cast<OSFontInterface>(inFont), inText, inWidth, inAlignment,
+                                        mStates.back().antiAlias, mStates.back().textDisplay);
 }
 
 void OSSurfaceInterface::DrawStringImpl(BrushInterface const& inBrush, FontInterface const& inFont,
@@ -255,9 +247,7 @@ void OSSurfaceInterface::DrawStringImpl(BrushInterface const& inBrush, FontInter
   auto const& brush = Cast<OSSolidBrushInterface>(inBrush);
   std::string text = ToUTF8(inText, -1);
   BeginDrawing(false);
-  PangoLayout* layout = PrepareLayout(inFont);
-  pango_layout_set_width(layout, -1);
-  pango_layout_set_text(layout, text.data(), static_cast<int>(text.size()));
+  PangoLayout* layout = CachedLayout(inFont, text, -1, kTextAlignLeft);
   PangoRectangle logical;
   pango_layout_get_extents(layout, nullptr, &logical);
   double width = static_cast<double>(logical.width) / PANGO_SCALE;
@@ -278,26 +268,24 @@ void OSSurfaceInterface::DrawMultiLineStringImpl(BrushInterface const& inBrush, 
   auto const& brush = Cast<OSSolidBrushInterface>(inBrush);
   std::string text = ToUTF8(inText, -1);
   BeginDrawing(false);
-  PangoLayout* layout = PrepareLayout(inFont);
-  pango_layout_set_wrap(layout, PANGO_WRAP_WORD_CHAR);
-  pango_layout_set_width(layout, static_cast<int>(inRect.width * PANGO_SCALE));
-  pango_layout_set_alignment(layout, inAlignment == kTextAlignCenter  ? PANGO_ALIGN_CENTER
-                                     : inAlignment == kTextAlignRight ? PANGO_ALIGN_RIGHT
-                                                                      : PANGO_ALIGN_LEFT);
-  pango_layout_set_text(layout, text.data(), static_cast<int>(text.size()));
+  PangoLayout* layout = CachedLayout(inFont, text, static_cast<int>(inRect.width * PANGO_SCALE), inAlignment);
   cairo_rectangle(mContext, inRect.left, inRect.top, inRect.width, inRect.height);
   cairo_clip(mContext);
   SetSourceColor(mContext, brush.GetColor());
   cairo_move_to(mContext, inRect.left, inRect.top);
   pango_cairo_show_layout(mContext, layout);
-  pango_layout_set_width(layout, -1);
-  pango_layout_set_alignment(layout, PANGO_ALIGN_LEFT);
   EndDrawing();
 }
 
 float OSSurfaceInterface::MeasureStringWidth(FontInterface const& inFont, unsigned short const* inText,
                                              long inLength) {
-  return Cast<OSFontInterface>(inFont).MeasureStringWidth(inText, inLength);
+  // Measured under this surface's text policies and scale, as drawing lays the
+  // text out, so that a measured width is the drawn width.
+  std::string text = inText && inLength != 0 ? ToUTF8(inText, inLength) : std::string();
+  if (text.empty()) return 0;
+  PangoRectangle logical;
+  pango_layout_get_extents(CachedLayout(inFont, text, -1, kTextAlignLeft), nullptr, &logical);
+  return static_cast<float>(logical.width) / PANGO_SCALE;
 }
 
 float OSSurfaceInterface::MeasureMultiLineStringHeight(FontInterface const& inFont, unsigned short const* inText,
