@@ -32,6 +32,9 @@ class UI_ArrangementView : public UI_SubView, public arrange::DefaultGroup<arran
   void UI_NodeChanged(NodeChange inChange) override;
   void UI_SetParent(UI_Container* inParent) override;
   void UI_LayoutChildren(const RectF& inOldSize, const RectF& inNewSize) override;
+  // The minimum of the candidate nearest the golden ratio, for hosts that
+  // place the view by its recommended size.
+  PointF UI_GetRecommendedSize() const override { return Arrangeable().BestSize(); }
 
   // ---- the group ----
   bool VisitChildren(boost::function<bool(arrange::IArrangeable const&)> inVisitor) const override;

@@ -38,6 +38,7 @@ TEST(ArrangementView, OnlyTheRootArrangesAndNestedChildrenLandInTheirParentsSpac
   EXPECT_EQ(a->UI_GetLocalRectF(true), RectF(0, 0, 30, 20));
   EXPECT_EQ(nested->UI_GetLocalRectF(true), RectF(30, 0, 40, 20));
   EXPECT_EQ(c->UI_GetLocalRectF(true), RectF(0, 10, 40, 10));
+  EXPECT_EQ(nested->UI_GetRecommendedSize(), UI_Node::PointF(40, 20));
   nested->UI_SetLocalRectF(RectF(30, 0, 60, 80));
   EXPECT_EQ(c->UI_GetLocalRectF(true), RectF(0, 10, 40, 10)) << "a nested view does not arrange itself";
 }
