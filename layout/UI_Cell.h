@@ -34,8 +34,8 @@ class UI_Cell : public tarsel::utility::RefCountedObject {
   PointF GetNodeOffset(long inIndex) const;
   // Makes each of the cell's nodes a child of inView, if it is not one yet.
   void FetchNodes(ui::UI_SubView& inView);
-  // The room the nodes need: each at its offset, at its recommended size (or
-  // its current size when it recommends none).
+  // The room the nodes need: each at its recommended size (or its current
+  // size when it recommends none), with its offset as padding on both sides.
   PointF RecalcCellSize(drawbot::Drawbot* inDrawbot) const;
   // Moves the nodes to the cell's corner plus their offsets, at the sizes
   // that RecalcCellSize counted.

@@ -41,6 +41,9 @@ class UI_GridView : public ui::UI_SubView {
   void ChildRemoved(ui::UI_Node* inChild) override;
 
  private:
+  // Under the nodes; the selected cell stands out in edit mode.
+  void DrawCellBorders(drawbot::Drawbot& inDrawbot);
+
   static bool sDrawCellBorders;
   UI_GridP mGrid;
   UI_LayoutFormatterP mFormatter;

@@ -32,11 +32,19 @@ bool ReadDimension(const std::string& inText, long inMin, long inMax, long& outV
 }  // namespace
 
 const char* GalleryPageName(GalleryPageID inPage) {
-  return inPage == GalleryPageID::kButtons ? "buttons" : "basics";
+  switch (inPage) {
+    case GalleryPageID::kButtons:
+      return "buttons";
+    case GalleryPageID::kLayout:
+      return "layout";
+    case GalleryPageID::kBasics:
+      break;
+  }
+  return "basics";
 }
 
 bool ReadGalleryPageName(const std::string& inName, GalleryPageID& outPage) {
-  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons}) {
+  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons, GalleryPageID::kLayout}) {
     if (inName == GalleryPageName(page)) {
       outPage = page;
       return true;
@@ -71,7 +79,7 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
         outOptions.screenshot = value;
       } else if (arg == "--page") {
         if (!ReadGalleryPageName(value, outOptions.page)) {
-          outError = Localized("$$$/norvik/gallery/Error/BadPage=There is no page ^0: the pages are basics and buttons.",
+          outError = Localized("$$$/norvik/gallery/Error/BadPage=There is no page ^0: the pages are basics, buttons and layout.",
                                value);
           return false;
         }
@@ -106,7 +114,7 @@ std::string GalleryUsage() {
       "  --light            start in the light look\n"
       "  --dark             start in the dark look (the default)\n"
       "  --size WxH         client size of the window in pixels (default 1120x720)\n"
-      "  --page NAME        start on the page NAME: basics (the default) or buttons\n"
+      "  --page NAME        start on the page NAME: basics (the default), buttons or layout\n"
       "  --exit-after-first-frame  exit once the first frame is shown, printing the time it took\n"
       "  --help             show this text\n");
 }

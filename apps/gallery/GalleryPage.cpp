@@ -2,6 +2,7 @@
 
 #include "BasicsView.h"
 #include "ButtonsView.h"
+#include "LayoutPageView.h"
 #include "PageSelector.h"
 
 #include <algorithm>
@@ -29,6 +30,8 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   AddGalleryChild(this, mBasics);
   mButtons.reset(new ButtonsView());
   AddGalleryChild(this, mButtons);
+  mLayout.reset(new LayoutPageView());
+  AddGalleryChild(this, mLayout);
   ShowPage(GalleryPageID::kBasics);
 }
 
@@ -37,9 +40,12 @@ void GalleryPage::ShowPage(GalleryPageID inPage) {
   GetPageSelector()->Select(inPage);
   mBasics->UI_Show(inPage == GalleryPageID::kBasics);
   mButtons->UI_Show(inPage == GalleryPageID::kButtons);
+  mLayout->UI_Show(inPage == GalleryPageID::kLayout);
   mHeader->SetSubtitle(
       inPage == GalleryPageID::kButtons
           ? Text("$$$/norvik/gallery/Subtitle/Buttons=Every kind of button in every state, and working ones to try")
+      : inPage == GalleryPageID::kLayout
+          ? Text("$$$/norvik/gallery/Subtitle/Layout=Dialogs composed by the layout builder, and grid views")
           : Text("$$$/norvik/gallery/Subtitle=Nodes, drawing, theme colours, hover and keyboard focus"));
   UI_Invalidate(nullptr, 0);
 }
@@ -47,6 +53,8 @@ void GalleryPage::ShowPage(GalleryPageID inPage) {
 PageSelector* GalleryPage::GetPageSelector() const { return static_cast<PageSelector*>(mSelector.get()); }
 
 ButtonsView* GalleryPage::GetButtonsPage() const { return static_cast<ButtonsView*>(mButtons.get()); }
+
+LayoutPageView* GalleryPage::GetLayoutPage() const { return static_cast<LayoutPageView*>(mLayout.get()); }
 
 void GalleryPage::SetLight(bool inLight) {
   mLight = inLight;
@@ -80,6 +88,7 @@ void GalleryPage::Arrange() {
   const RectF body(kMargin, top, std::max(0.0f, r.width - 2 * kMargin), std::max(0.0f, r.height - top - kMargin));
   mBasics->UI_SetLocalRectF(body);
   mButtons->UI_SetLocalRectF(body);
+  mLayout->UI_SetLocalRectF(body);
 }
 
 void GalleryPage::UI_Draw(drawbot::Drawbot* inDrawbot) {

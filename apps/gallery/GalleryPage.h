@@ -12,6 +12,7 @@ namespace norvik::gallery {
 
 class BasicsView;
 class ButtonsView;
+class LayoutPageView;
 class PageSelector;
 
 class GalleryPage : public ui::UI_SubView {
@@ -29,6 +30,7 @@ class GalleryPage : public ui::UI_SubView {
   BrightnessSwitch* GetBrightnessSwitch() const { return mSwitch.get(); }
   PageSelector* GetPageSelector() const;
   ButtonsView* GetButtonsPage() const;
+  LayoutPageView* GetLayoutPage() const;
   // A section of the basics page.
   SectionView* GetSection(const char* inID);
   // The tiles of the focus section, in tab order.
@@ -55,6 +57,7 @@ class GalleryPage : public ui::UI_SubView {
   ui::UI_NodeP mSelector;
   ui::UI_NodeP mBasics;
   ui::UI_NodeP mButtons;
+  ui::UI_NodeP mLayout;
   GalleryPageID mShown = GalleryPageID::kBasics;
 };
 

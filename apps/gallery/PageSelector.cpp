@@ -12,7 +12,7 @@ namespace norvik::gallery {
 namespace {
 
 // The bar's value for each page.
-double ValueOf(GalleryPageID inPage) { return inPage == GalleryPageID::kButtons ? 1 : 0; }
+double ValueOf(GalleryPageID inPage) { return static_cast<double>(static_cast<int>(inPage)); }
 
 }  // namespace
 
@@ -23,6 +23,7 @@ PageSelector::PageSelector() {
   bar->UI_SetNodeID("page-bar");
   bar->AddTextButton(Text("$$$/norvik/gallery/Page/Basics=Basics"), ValueOf(GalleryPageID::kBasics));
   bar->AddTextButton(Text("$$$/norvik/gallery/Page/Buttons=Buttons"), ValueOf(GalleryPageID::kButtons));
+  bar->AddTextButton(Text("$$$/norvik/gallery/Page/Layout=Layout"), ValueOf(GalleryPageID::kLayout));
   bar->SetValue(ValueOf(GalleryPageID::kBasics));
   AddGalleryChild(this, mBar);
   bar->NotifyWhenChanged(ui::MakeNotification<void(controls::UI_ControlChangedMessage*)>(
@@ -41,11 +42,13 @@ void PageSelector::ChoiceMade() {
 void PageSelector::Select(GalleryPageID inPage) { Bar()->SetValue(ValueOf(inPage)); }
 
 GalleryPageID PageSelector::GetSelected() const {
-  return Bar()->GetValue() == ValueOf(GalleryPageID::kButtons) ? GalleryPageID::kButtons : GalleryPageID::kBasics;
+  for (GalleryPageID page : {GalleryPageID::kButtons, GalleryPageID::kLayout})
+    if (Bar()->GetValue() == ValueOf(page)) return page;
+  return GalleryPageID::kBasics;
 }
 
 ui::UI_Node* PageSelector::GetChoice(GalleryPageID inPage) const {
-  return Bar()->GetButton(inPage == GalleryPageID::kButtons ? 1 : 0);
+  return Bar()->GetButton(static_cast<long>(ValueOf(inPage)));
 }
 
 float PageSelector::GetPreferredWidth() const { return Bar()->GetButtonbarWidth(); }

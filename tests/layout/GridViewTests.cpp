@@ -42,7 +42,7 @@ TEST_F(GridViewTest, CellsTakeTheirNodesSizesAndTheViewGrowsOnceToHoldThem) {
   EXPECT_EQ(formatter->passes, 2) << "one pass per addition, none from the resize it causes";
   EXPECT_EQ(a->UI_GetLocalRectF(true), RectF(2, 3, 30, 10));
   EXPECT_EQ(b->UI_GetLocalRectF(true), RectF(33, 14, 20, 25));
-  EXPECT_EQ(view->UI_GetLocalRectF(false), RectF(0, 0, 57, 44)) << "cells plus the right and bottom margins";
+  EXPECT_EQ(view->UI_GetLocalRectF(false), RectF(0, 0, 58, 45)) << "cells, padded by their offsets, plus the right and bottom margins";
 }
 
 TEST_F(GridViewTest, ANodeAddedWhileACellIsSelectedGoesIntoThatCell) {

@@ -53,8 +53,8 @@ PointF UI_Cell::RecalcCellSize(drawbot::Drawbot*) const {
   PointF need;
   for (const Entry& entry : mNodes) {
     const PointF size = NodeSize(*entry.node);
-    need.x = std::max(need.x, entry.offset.x + size.x);
-    need.y = std::max(need.y, entry.offset.y + size.y);
+    need.x = std::max(need.x, 2 * entry.offset.x + size.x);
+    need.y = std::max(need.y, 2 * entry.offset.y + size.y);
   }
   return need;
 }

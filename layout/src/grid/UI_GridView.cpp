@@ -89,7 +89,11 @@ bool UI_GridView::UI_DoMouseEvent(ui::UI_Node* inTarget, const ui::MouseEvent& i
 }
 
 void UI_GridView::UI_Draw(drawbot::Drawbot* inDrawbot) {
-  if (!inDrawbot || !(sDrawCellBorders || mEditMode)) return;
+  if (inDrawbot && (sDrawCellBorders || mEditMode)) DrawCellBorders(*inDrawbot);
+  UI_SubView::UI_Draw(inDrawbot);
+}
+
+void UI_GridView::DrawCellBorders(drawbot::Drawbot& inDrawbot) {
   const ui::ThemeP theme = UI_GetCurrentTheme();
   drawbot::ColorRGBA color = theme && theme->HasColor(kBorderColor) ? theme->GetColor(kBorderColor)
                                                                      : drawbot::ColorRGBA(0.5f, 0.5f, 0.5f);
@@ -100,7 +104,7 @@ void UI_GridView::UI_Draw(drawbot::Drawbot* inDrawbot) {
       if (!cell->IsVisible() || r.IsEmpty()) continue;
       drawbot::ColorRGBA c = color;
       c.alpha *= mEditMode && cell->IsSelected() ? 1.0f : kBorderAlpha;
-      StrokeRect(*inDrawbot,
+      StrokeRect(inDrawbot,
                  tarsel::geom::RectT<long>(std::lround(r.left), std::lround(r.top), std::lround(r.width),
                                            std::lround(r.height)),
                  c, 1);
