@@ -268,12 +268,14 @@ TEST_F(ButtonsPageTest, TheArrowKeysSwitchPagesOnceTheSelectorHasTheFocus) {
   system.TypeKey(kVirtualKeyRight);
   system.Pump();
   EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons);
-  system.TypeKey(kVirtualKeyRight);
-  system.Pump();
-  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons) << "the row ends without wrapping";
+  for (int i = 0; i < 2; ++i) {
+    system.TypeKey(kVirtualKeyRight);
+    system.Pump();
+    EXPECT_EQ(page->GetShownPage(), GalleryPageID::kLayout) << "the row ends without wrapping";
+  }
   system.TypeKey(kVirtualKeyLeft);
   system.Pump();
-  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kBasics);
+  EXPECT_EQ(page->GetShownPage(), GalleryPageID::kButtons);
 }
 
 TEST_F(ButtonsPageTest, HiddenPagesTakeNoClicks) {
