@@ -172,8 +172,11 @@ void WriteValue(std::string& out, const PropValue& inValue, int inDepth) {
     case ValueType::kString: WriteScalar(out, ValueType::kString, std::get<UTF8String>(s), inDepth); break;
     case ValueType::kUString: WriteScalar(out, ValueType::kUString, std::get<UTF16String>(s), inDepth); break;
     case ValueType::kList: {
+      // Not `list ? *list : PropList()`: the conditional would copy the whole
+      // nested list, at every level, before writing it.
+      static const PropList kEmpty;
       const PropListP& list = std::get<PropListP>(s);
-      WriteList(out, list ? *list : PropList(), inDepth);
+      WriteList(out, list ? *list : kEmpty, inDepth);
       break;
     }
     case ValueType::kInt32Array:
