@@ -107,14 +107,17 @@ UTF16String PicaUnitHandler::GetFormattedString(double inValue, int inDecimals, 
                                                 bool) const {
   const double whole = std::floor(std::fabs(inValue));
   const double fraction = std::fabs(inValue) - whole;
-  UTF16String text;
-  // With no whole picas the sign has nowhere else to go.
-  if (inValue < 0 && whole == 0 && fraction != 0) text = u"-";
-  text += CommonUnitHandler::GetFormattedString(inValue < 0 ? -whole : whole, 0, inFlags, true);
   // The points are never signed: "+1p+6" would not read back.
-  FormatFlags pointFlags = inFlags;
-  pointFlags.Clear(tu::kNumberFormatAlwaysSign | tu::kNumberFormatPadSign);
-  text += tu::NumberToString(fraction * 12, 0, inDecimals, pointFlags, kMaxFixedLength);
+  FormatFlags unsignedFlags = inFlags;
+  unsignedFlags.Clear(tu::kNumberFormatAlwaysSign | tu::kNumberFormatPadSign);
+  UTF16String text;
+  // With no whole picas the sign has nowhere else to go; the zero after it
+  // then takes no sign or pad of its own ("- 0p6" would not read back).
+  const bool leadingMinus = inValue < 0 && whole == 0 && fraction != 0;
+  if (leadingMinus) text = u"-";
+  text += CommonUnitHandler::GetFormattedString(inValue < 0 ? -whole : whole, 0,
+                                                leadingMinus ? unsignedFlags : inFlags, true);
+  text += tu::NumberToString(fraction * 12, 0, inDecimals, unsignedFlags, kMaxFixedLength);
   return text;
 }
 
