@@ -37,6 +37,8 @@ const char* GalleryPageName(GalleryPageID inPage) {
       return "buttons";
     case GalleryPageID::kLayout:
       return "layout";
+    case GalleryPageID::kNumbers:
+      return "numbers";
     case GalleryPageID::kBasics:
       break;
   }
@@ -44,7 +46,8 @@ const char* GalleryPageName(GalleryPageID inPage) {
 }
 
 bool ReadGalleryPageName(const std::string& inName, GalleryPageID& outPage) {
-  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons, GalleryPageID::kLayout}) {
+  for (GalleryPageID page : {GalleryPageID::kBasics, GalleryPageID::kButtons, GalleryPageID::kLayout,
+                              GalleryPageID::kNumbers}) {
     if (inName == GalleryPageName(page)) {
       outPage = page;
       return true;
@@ -79,7 +82,7 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
         outOptions.screenshot = value;
       } else if (arg == "--page") {
         if (!ReadGalleryPageName(value, outOptions.page)) {
-          outError = Localized("$$$/norvik/gallery/Error/BadPage=There is no page ^0: the pages are basics, buttons and layout.",
+          outError = Localized("$$$/norvik/gallery/Error/BadPage=There is no page ^0: the pages are basics, buttons, layout and numbers.",
                                value);
           return false;
         }
@@ -114,7 +117,7 @@ std::string GalleryUsage() {
       "  --light            start in the light look\n"
       "  --dark             start in the dark look (the default)\n"
       "  --size WxH         client size of the window in pixels (default 1120x720)\n"
-      "  --page NAME        start on the page NAME: basics (the default), buttons or layout\n"
+      "  --page NAME        start on the page NAME: basics (the default), buttons, layout or numbers\n"
       "  --exit-after-first-frame  exit once the first frame is shown, printing the time it took\n"
       "  --help             show this text\n");
 }

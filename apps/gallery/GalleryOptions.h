@@ -6,7 +6,7 @@
 namespace norvik::gallery {
 
 // The pages of the gallery, and their names on the command line.
-enum class GalleryPageID { kBasics, kButtons, kLayout };
+enum class GalleryPageID { kBasics, kButtons, kLayout, kNumbers };
 const char* GalleryPageName(GalleryPageID inPage);
 // False, leaving outPage alone, for a name that is no page.
 bool ReadGalleryPageName(const std::string& inName, GalleryPageID& outPage);

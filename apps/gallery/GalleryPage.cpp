@@ -3,6 +3,7 @@
 #include "BasicsView.h"
 #include "ButtonsView.h"
 #include "LayoutPageView.h"
+#include "NumbersView.h"
 #include "PageSelector.h"
 
 #include <algorithm>
@@ -32,6 +33,8 @@ GalleryPage::GalleryPage(ui::KeyframeThemeEditorP inTheme, bool inLight) : mThem
   AddGalleryChild(this, mButtons);
   mLayout.reset(new LayoutPageView());
   AddGalleryChild(this, mLayout);
+  mNumbers.reset(new NumbersView());
+  AddGalleryChild(this, mNumbers);
   ShowPage(GalleryPageID::kBasics);
 }
 
@@ -41,11 +44,15 @@ void GalleryPage::ShowPage(GalleryPageID inPage) {
   mBasics->UI_Show(inPage == GalleryPageID::kBasics);
   mButtons->UI_Show(inPage == GalleryPageID::kButtons);
   mLayout->UI_Show(inPage == GalleryPageID::kLayout);
+  mNumbers->UI_Show(inPage == GalleryPageID::kNumbers);
   mHeader->SetSubtitle(
       inPage == GalleryPageID::kButtons
           ? Text("$$$/norvik/gallery/Subtitle/Buttons=Every kind of button in every state, and working ones to try")
       : inPage == GalleryPageID::kLayout
           ? Text("$$$/norvik/gallery/Subtitle/Layout=Dialogs composed by the layout builder, and grid views")
+      : inPage == GalleryPageID::kNumbers
+          ? Text("$$$/norvik/gallery/Subtitle/Numbers=Typed expressions evaluated per field unit, number formats and "
+                 "steps")
           : Text("$$$/norvik/gallery/Subtitle=Nodes, drawing, theme colours, hover and keyboard focus"));
   UI_Invalidate(nullptr, 0);
 }
@@ -89,6 +96,7 @@ void GalleryPage::Arrange() {
   mBasics->UI_SetLocalRectF(body);
   mButtons->UI_SetLocalRectF(body);
   mLayout->UI_SetLocalRectF(body);
+  mNumbers->UI_SetLocalRectF(body);
 }
 
 void GalleryPage::UI_Draw(drawbot::Drawbot* inDrawbot) {

@@ -58,6 +58,7 @@ class GalleryPage : public ui::UI_SubView {
   ui::UI_NodeP mBasics;
   ui::UI_NodeP mButtons;
   ui::UI_NodeP mLayout;
+  ui::UI_NodeP mNumbers;
   GalleryPageID mShown = GalleryPageID::kBasics;
 };
 

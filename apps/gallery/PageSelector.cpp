@@ -24,6 +24,7 @@ PageSelector::PageSelector() {
   bar->AddTextButton(Text("$$$/norvik/gallery/Page/Basics=Basics"), ValueOf(GalleryPageID::kBasics));
   bar->AddTextButton(Text("$$$/norvik/gallery/Page/Buttons=Buttons"), ValueOf(GalleryPageID::kButtons));
   bar->AddTextButton(Text("$$$/norvik/gallery/Page/Layout=Layout"), ValueOf(GalleryPageID::kLayout));
+  bar->AddTextButton(Text("$$$/norvik/gallery/Page/Numbers=Numbers and units"), ValueOf(GalleryPageID::kNumbers));
   bar->SetValue(ValueOf(GalleryPageID::kBasics));
   AddGalleryChild(this, mBar);
   bar->NotifyWhenChanged(ui::MakeNotification<void(controls::UI_ControlChangedMessage*)>(
@@ -42,7 +43,7 @@ void PageSelector::ChoiceMade() {
 void PageSelector::Select(GalleryPageID inPage) { Bar()->SetValue(ValueOf(inPage)); }
 
 GalleryPageID PageSelector::GetSelected() const {
-  for (GalleryPageID page : {GalleryPageID::kButtons, GalleryPageID::kLayout})
+  for (GalleryPageID page : {GalleryPageID::kButtons, GalleryPageID::kLayout, GalleryPageID::kNumbers})
     if (Bar()->GetValue() == ValueOf(page)) return page;
   return GalleryPageID::kBasics;
 }

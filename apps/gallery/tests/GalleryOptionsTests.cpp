@@ -93,6 +93,7 @@ TEST(GalleryOptions, PageNamesEitherPageAndTheLastOneCounts) {
   EXPECT_EQ(buttons.options.page, GalleryPageID::kButtons);
   EXPECT_TRUE(buttons.options.light);
   EXPECT_EQ(buttons.options.screenshot, "/tmp/b.png");
+  EXPECT_EQ(Parse({"--page", "numbers"}).options.page, GalleryPageID::kNumbers);
   Parsed back = Parse({"--page", "buttons", "--page", "basics"});
   ASSERT_TRUE(back.ok);
   EXPECT_EQ(back.options.page, GalleryPageID::kBasics);
