@@ -25,12 +25,12 @@ struct FieldColumn {
 };
 
 const FieldColumn kFields[] = {
-    {controls::kNumberEditUnit_Point, "$$$/norvik/gallery/Numbers/Point=Point field"},
-    {controls::kNumberEditUnit_Inch, "$$$/norvik/gallery/Numbers/Inch=Inch field"},
-    {controls::kNumberEditUnit_CM, "$$$/norvik/gallery/Numbers/CM=Centimetre field"},
-    {controls::kNumberEditUnit_Pica, "$$$/norvik/gallery/Numbers/Pica=Pica field"},
-    {controls::kNumberEditUnit_Percent, "$$$/norvik/gallery/Numbers/Percent=Percent field"},
-    {controls::kNumberEditUnit_Degree, "$$$/norvik/gallery/Numbers/Degree=Degree field"},
+    {controls::kNumberEditUnit_Point, "$$$/norvik/gallery/Numbers/Point=Point"},
+    {controls::kNumberEditUnit_Inch, "$$$/norvik/gallery/Numbers/Inch=Inch"},
+    {controls::kNumberEditUnit_CM, "$$$/norvik/gallery/Numbers/CM=Centimetre"},
+    {controls::kNumberEditUnit_Pica, "$$$/norvik/gallery/Numbers/Pica=Pica"},
+    {controls::kNumberEditUnit_Percent, "$$$/norvik/gallery/Numbers/Percent=Percent"},
+    {controls::kNumberEditUnit_Degree, "$$$/norvik/gallery/Numbers/Degree=Degree"},
 };
 
 // Every field starts from 20 of its own unit.
@@ -164,7 +164,7 @@ void NumberFormatsView::UI_Draw(drawbot::Drawbot* inDrawbot) {
 NumbersView::NumbersView() {
   UI_SetNodeID("numbers-page");
   mExpressionSection.reset(new SectionView(
-      "$$$/norvik/gallery/Numbers/ExpressionsTitle=Typed expressions, previous value 20, 2 decimal places"));
+      "$$$/norvik/gallery/Numbers/ExpressionsTitle=Typed expressions in fields of six units, previous value 20, 2 decimal places"));
   mExpressionSection->UI_SetNodeID("numbers-expression-section");
   AddGalleryChild(this, mExpressionSection);
   mFormatSection.reset(new SectionView("$$$/norvik/gallery/Numbers/FormatsTitle=Number data"));

@@ -140,7 +140,8 @@ bool UnitHandlerRegistry::CalculateToBaseUnit(const UTF16String& inText, NumberE
       if (operand->unit != kNumberEditUnit_Pica) continue;
       const UnitHandlerP pica = GetUnitHandler(kNumberEditUnit_Pica);
       if (!pica) return false;
-      const double points = operand->number < 0 ? -operand->points : operand->points;
+      // "-0p6" is six points below zero: the sign of a negative zero counts.
+      const double points = std::signbit(operand->number) ? -operand->points : operand->points;
       operand->number = pica->ToBaseUnit(operand->number) + points;
       operand->unit = kNumberEditUnit_Point;
     }

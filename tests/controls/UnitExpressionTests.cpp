@@ -41,7 +41,8 @@ TEST_F(UnitExpressionTest, TypedTextEvaluatesByTheUnitsTheFieldKnows) {
   const Case cases[] = {
       {u"50%", kPt, 3.5, false},           {u"1 + 2 + 3", kPt, 7, true},
       {u"1,234.5", kPt, 1234.5, false},     {u"1p6", kPt, 18, false},
-      {u"-1p6", kPt, -18, false},           {u"1 picas", kPt, 12, false},
+      {u"-1p6", kPt, -18, false},           {u"-0p6", kPt, -6, false},
+      {u"1 picas", kPt, 12, false},
       {u"10 / 0", kPt, 7, true},            {u"2in * 3", kPt, 432, false},
       {u"2in * 3in", kPt, 7, true},         {u"3in + 2cm", kPt, 216 + 144 / 2.54, false},
       {u"1 centimeters", kPt, 72 / 2.54, false}, {u"1cm", kDeg, 7, true},

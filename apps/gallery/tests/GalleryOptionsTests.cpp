@@ -105,7 +105,7 @@ TEST(GalleryOptions, AnUnknownPageIsRefusedWithItsNameAndThePagesThereAre) {
     Parsed p = Parse({"--page", name});
     EXPECT_FALSE(p.ok) << name;
     EXPECT_NE(p.error.find(std::string("page ") + name + ":"), std::string::npos) << p.error;
-    EXPECT_NE(p.error.find("basics, buttons and layout"), std::string::npos) << p.error;
+    EXPECT_NE(p.error.find("basics, buttons, layout and numbers"), std::string::npos) << p.error;
   }
   Parsed missing = Parse({"--page"});
   EXPECT_FALSE(missing.ok);
