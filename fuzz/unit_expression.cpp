@@ -36,7 +36,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t in
                          error);
   if (!std::isfinite(value)) std::abort();
   if (error) return 0;
-  const double step = std::pow(10.0, -std::max(decimals, 0));
+  // Negative decimal places round to tens or hundreds: the step is that wide.
+  const double step = std::pow(10.0, -decimals);
   // Bounds closer than one shown step cannot both be kept by the rounding.
   if (maxValue - minValue >= step && (value < minValue || value > maxValue)) std::abort();
 
