@@ -8,7 +8,9 @@
 set -euo pipefail
 cd "$(dirname "$0")/.."
 ROUNDS="${1:-3}"
-PEER="${QT_PEER:-$(cd .. && pwd)/shared/peers/qt/run.sh}"
+# The peer sits beside the main checkout; a worktree finds it through git.
+MAIN="$(cd "$(git rev-parse --git-common-dir)/.." && pwd)"
+PEER="${QT_PEER:-$MAIN/../shared/peers/qt/run.sh}"
 [ -f "$PEER" ] || { echo "compare-with-qt: no Qt peer at $PEER (set QT_PEER)" >&2; exit 1; }
 cmake --preset release >/dev/null
 cmake --build build/release --target bench_draw_traversal bench_drawing bench_node_tree bench_dispatch bench_focus >/dev/null
