@@ -40,8 +40,9 @@ ThemeStamp CurrentThemeStamp(const UI_Node& inNode) {
 // The test is made in the parent's coordinates, on floats, with a margin of
 // two child units and a pixel: the full test rounds the child's rectangle and
 // the clip in the child's coordinates outwards, each by less than a unit.
+// Whether the child is shown or native is left to the full dispatch, which
+// asks again anyway: here it would only double the calls for every child.
 bool MayTouchClip(const UI_Node& inChild, const UI_Node::RectL& inClip) {
-  if (inChild.UI_ReceivesEventsFromOS() || !inChild.UI_IsShown()) return false;
   const UI_Node::Matrix m = inChild.UI_GetSelfToParentMatrix();
   if (!(std::fabs(m.sx) > kMinimumScale) || !(std::fabs(m.sy) > kMinimumScale)) return false;
   const UI_Node::RectF local = inChild.UI_GetLocalRectF(false);
