@@ -1,24 +1,11 @@
 #include "drawbot/MemBuffer.h"
 
 #include <cstdint>
-#include <cstdlib>
 #include <cstring>
-#include <new>
+
+#include "tarsel/ErrorManager.h"
 
 namespace norvik::drawbot {
-
-namespace {
-
-// Tries an allocation a few times before giving up. Stands in for the core
-// library's retrying allocator until that exists.
-void* AllocateWithRetries(size_t inSize, int inAttempts) {
-  for (int i = 0; i < inAttempts; ++i) {
-    if (void* p = std::malloc(inSize)) return p;
-  }
-  throw std::bad_alloc();
-}
-
-}  // namespace
 
 MemBuffer::MemBuffer(short inWidth, short inHeight, short inChannels)
     : mWidth(inWidth),
@@ -26,12 +13,12 @@ MemBuffer::MemBuffer(short inWidth, short inHeight, short inChannels)
       mChannels(inChannels),
       mRowBytes(static_cast<short>((inWidth * inChannels + 15) & ~15)) {
   size_t size = static_cast<size_t>(mRowBytes) * static_cast<size_t>(mHeight > 0 ? mHeight : 0) + 16;
-  mBlock = static_cast<unsigned char*>(AllocateWithRetries(size, 3));
+  mBlock = static_cast<unsigned char*>(tarsel::config::ErrorManager::Get(true)->AllocateWithRetries(size, 3));
   auto address = reinterpret_cast<std::uintptr_t>(mBlock);
   mData = mBlock + ((16 - (address & 15)) & 15);
 }
 
-MemBuffer::~MemBuffer() { std::free(mBlock); }
+MemBuffer::~MemBuffer() { tarsel::config::ErrorManager::Get(true)->Deallocate(mBlock); }
 
 void MemBuffer::ClearBuffer() {
   std::memset(mData, 0, static_cast<size_t>(mRowBytes) * static_cast<size_t>(mHeight > 0 ? mHeight : 0));

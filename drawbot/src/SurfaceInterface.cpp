@@ -7,7 +7,7 @@
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
 #include "drawbot/SupplierInterface.h"
-#include "drawbot/src/LineEnding.h"
+#include "tarsel/StringUtils.h"
 
 namespace norvik::drawbot {
 
@@ -159,7 +159,7 @@ void SurfaceInterface::DrawStringWithUnderline(BrushInterface const& inBrush, Fo
 }
 
 float SurfaceInterface::MeasureMaximumMultiLineStringWidth(FontInterface const& inFont, UTF16String const& inText) {
-  UTF16String const& ending = detail::GetLineEnding();
+  UTF16String const& ending = tarsel::utility::GetLineEnding();
   float widest = 0;
   size_t start = 0;
   while (start <= inText.size()) {

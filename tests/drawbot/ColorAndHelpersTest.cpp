@@ -8,6 +8,7 @@
 #include "drawbot/DrawHelpers.h"
 #include "drawbot/MemBuffer.h"
 #include "support/drawbot/RecordingSupplier.h"
+#include "tarsel/ErrorManager.h"
 #include "tarsel/ThrowError.h"
 
 namespace norvik::drawbot {
@@ -298,6 +299,21 @@ TEST(MemBuffers, RowsAreSixteenByteAlignedAndChannelsSwap) {
   EXPECT_EQ(row1[2], 1);
   boost::intrusive_ptr<MemBuffer> wide(new MemBuffer(17, 2, 4));
   EXPECT_EQ(wide->GetRowBytes(), 80);
+}
+
+TEST(MemBuffers, AllocationGoesThroughTheErrorManagerWithThreeAttemptsAndRaisesOutOfMemory) {
+  auto* manager = tarsel::config::ErrorManager::Get(true);
+  std::vector<std::size_t> requests;
+  manager->SetBlockFunctions([&](std::size_t inSize) -> void* { requests.push_back(inSize); return nullptr; },
+                             [](void*) {});
+  try {
+    MemBuffer failing(5, 3, 3);
+    ADD_FAILURE() << "a failed allocation built a buffer";
+  } catch (tarsel::config::Exception const& error) {
+    EXPECT_EQ(error.GetKeyPath(), "tarsel/config/Error/OutOfMemory");
+  }
+  manager->SetBlockFunctions({}, {});
+  EXPECT_EQ(requests, (std::vector<std::size_t>(3, 16 * 3 + 16)));
 }
 
 }  // namespace
