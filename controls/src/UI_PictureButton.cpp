@@ -2,6 +2,7 @@
 
 #include <cmath>
 
+#include "controls/DrawButtonFaces.h"
 #include "drawbot/Drawbot.h"
 #include "ui/KeyboardEvent.h"
 #include "tarsel/ThrowError.h"
@@ -11,25 +12,6 @@ namespace norvik::controls {
 
 namespace {
 constexpr std::uint64_t kDisabledImageAlphaColor = 306;
-
-class DrawButtonPicture : public DrawButtonFace {
- public:
-  DrawButtonPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage, float inScale,
-                    float inAlpha)
-      : mParams(inParams), mImage(inImage), mScale(inScale), mAlpha(inAlpha) {}
-  void operator()(tarsel::utility::Flags<unsigned long>, const tarsel::geom::RectT<float>& inRect,
-                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme&,
-                  const ColorChangeMap*) const override {
-    const tarsel::geom::RectT<float> r(inRect.left + inOffset.x, inRect.top + inOffset.y, inRect.width,
-                                       inRect.height);
-    UI_PictureButton::DrawPicture(mParams, mImage, r, mScale, mAlpha, inDrawbot);
-  }
-
- private:
-  const DrawParameters& mParams;
-  const drawbot::ImageInterface& mImage;
-  float mScale, mAlpha;
-};
 
 // Sets the supplier of the drawing under way, and puts the outer one back.
 class ScDrawingSupplier {

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "controls/DrawButtonFaces.h"
 #include "drawbot/Drawbot.h"
 #include "ui/KeyboardEvent.h"
 
@@ -10,24 +11,6 @@ namespace norvik::controls {
 namespace {
 constexpr float kTextMargin = 10;     // left and right of the label
 constexpr float kTextVerticalPad = 9;  // 4 above, 4 below, 1 for the free top row
-
-class DrawButtonText : public DrawButtonFace {
- public:
-  DrawButtonText(const DrawParameters& inParams, const DrawTextControlBaseParameters& inText, float inIndent)
-      : mParams(inParams), mText(inText), mIndent(inIndent) {}
-  void operator()(tarsel::utility::Flags<unsigned long>, const tarsel::geom::RectT<float>& inRect,
-                  const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme&,
-                  const ColorChangeMap*) const override {
-    const tarsel::geom::RectT<float> r(inRect.left + inOffset.x + mIndent, inRect.top + inOffset.y,
-                                       inRect.width - mIndent, inRect.height);
-    DrawControlLabel(mParams, mText, r, inDrawbot);
-  }
-
- private:
-  const DrawParameters& mParams;
-  const DrawTextControlBaseParameters& mText;
-  float mIndent;
-};
 }  // namespace
 
 float RoundHalfAway(float inValue) {

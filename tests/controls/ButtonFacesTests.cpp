@@ -15,6 +15,7 @@
 
 #include "tarsel/ThrowError.h"
 
+#include "controls/DrawButtonFaces.h"
 #include "controls/UI_Checkbox.h"
 #include "controls/UI_DisclosureTriangleButton.h"
 #include "controls/UI_PictureButton.h"
@@ -67,6 +68,35 @@ TEST(PictureButtonDrawing, ScaleAndNoImage) {
   params.SetDrawContainer(true);
   UI_PictureButton::Draw(params, bareBot);
   EXPECT_GT(PaintedPixels(bare.Snapshot()), 200) << "without an image the bevel is still painted";
+}
+
+TEST(ButtonFaces, ThePublicFacesDrawWithNoButtonAtTheOffsetTheBevelGives) {
+  PixelCanvas canvas(20, 20);
+  std::uint32_t blue[4];
+  std::fill(std::begin(blue), std::end(blue), 0xFF0000FFu);
+  drawbot::BufferImageP image(canvas.GetSupplier(), 2, 2, 8, drawbot::kPixelLayoutBGRAPremul, blue, nullptr);
+  const DrawParameters params;
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  const DrawButtonPicture picture(params, *image.Get(), 2, 1);
+  picture(StateFlags(), RectF(0, 0, 10, 10), PointF(5, 1), drawbot, *params.GetTheme(), nullptr);
+  const PixelImage shot = canvas.Snapshot();
+  EXPECT_EQ(PaintedPixels(shot), 16);
+  EXPECT_NE(shot.At(8, 4), 0u) << "centred at (3, 3) and moved by the offset";
+  EXPECT_EQ(shot.At(7, 4), 0u);
+
+  PixelCanvas textCanvas(60, 20);
+  drawbot::Drawbot textBot(textCanvas.GetSupplier(), textCanvas.GetSurface());
+  DrawTextButtonParameters text;
+  text.SetText(u"Mute");
+  text.SetTextAlignment(drawbot::kTextAlignLeft);
+  const DrawButtonText label(text, text, 30);
+  label(StateFlags(), RectF(0, 0, 60, 20), PointF(0, 0), textBot, *text.GetTheme(), nullptr);
+  const PixelImage textShot = textCanvas.Snapshot();
+  int firstInked = -1;
+  for (int x = 0; x < textShot.width && firstInked < 0; ++x)
+    for (int y = 0; y < textShot.height; ++y)
+      if ((textShot.At(x, y) >> 24) != 0) firstInked = x;
+  EXPECT_GE(firstInked, 30) << "the indent moves the label";
 }
 
 class PictureButtonKeys : public ControlTest {
