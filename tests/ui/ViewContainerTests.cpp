@@ -97,16 +97,26 @@ TEST_F(ViewContainerTest, AViewInANestedContainerReceivesClicksInItsOwnCoordinat
   EXPECT_FLOAT_EQ(view->mouse[0].GetPosition().y, 20.0f);
 }
 
-TEST_F(ViewContainerTest, APopupContainerPaintsThePanelBackgroundOrNothing) {
-  boost::intrusive_ptr<OS_PopupViewContainer> popup(new OS_PopupViewContainer(false, true));
-  popup->UI_SetLocalRect(UI_Node::RectL(0, 0, 40, 40));
-  popup->UI_Show(true);
-  popup->UI_Invalidate(nullptr, 0);
+TEST_F(ViewContainerTest, PopupContainersPaintTheirOwnThemesPanelAndTheWindowFormAVisibleFrame) {
+  const drawbot::ColorRGBA panel{0.2f, 0.6f, 0.4f, 1.0f};
+  boost::intrusive_ptr<OS_PopupViewContainer> plain(new OS_PopupViewContainer(false, true));
+  boost::intrusive_ptr<OS_PopupViewContainer> framed(new PopupWindowViewContainer);
+  for (auto& popup : {plain, framed}) {
+    popup->SetCustomThemeColor(277, panel);
+    popup->UI_SetLocalRect(UI_Node::RectL(0, 0, 40, 40));
+    popup->UI_Show(true);
+    popup->UI_Invalidate(nullptr, 0);
+  }
   mSystem.Pump();
-  const drawbot::ColorRGBA expected = GetColor(277);
-  const HeadlessPixels pixels = mSystem.ReadWindowPixels(popup->GetHandle());
-  ASSERT_EQ(pixels.width, 40);
-  EXPECT_EQ(pixels.At(20, 20), Opaque(expected.red, expected.green, expected.blue));
+  const HeadlessPixels plainPixels = mSystem.ReadWindowPixels(plain->GetHandle());
+  const HeadlessPixels framedPixels = mSystem.ReadWindowPixels(framed->GetHandle());
+  ASSERT_EQ(plainPixels.width, 40);
+  ASSERT_EQ(framedPixels.width, 40);
+  EXPECT_EQ(plainPixels.At(20, 20), Opaque(panel.red, panel.green, panel.blue));
+  EXPECT_EQ(framedPixels.At(20, 20), Opaque(panel.red, panel.green, panel.blue));
+  EXPECT_EQ(plainPixels.At(1, 20), plainPixels.At(20, 20));
+  EXPECT_NE(framedPixels.At(1, 20), framedPixels.At(20, 20)) << "the frame one pixel in stands out";
+  EXPECT_EQ(framedPixels.At(3, 20), framedPixels.At(20, 20));
 }
 
 TEST_F(ViewContainerTest, APopupWindowIsTopmostAndNeverActivates) {

@@ -7,7 +7,9 @@
 namespace norvik::ui {
 
 namespace {
-constexpr std::uint64_t kPopupFrameColor = 277;
+// The divider grey: it stands apart from the panel fill in the light and in
+// the dark look, where the fill's own colour would leave the frame unseen.
+constexpr std::uint64_t kPopupFrameColor = 20;
 }
 
 OS_PopupWindow::OS_PopupWindow(const drawbot::SupplierInterface* inSupplier) : mSupplier(inSupplier) {
@@ -30,7 +32,7 @@ void PopupWindowViewContainer::UI_Draw(drawbot::Drawbot* inDrawbot) {
   frame.top += 1;
   frame.width -= 2;
   frame.height -= 2;
-  if (frame.width > 0 && frame.height > 0) StrokeRect(*inDrawbot, frame, GetColor(kPopupFrameColor), 1.0f);
+  if (frame.width > 0 && frame.height > 0) StrokeRect(*inDrawbot, frame, GetThemeColor(kPopupFrameColor), 1.0f);
 }
 
 }  // namespace norvik::ui

@@ -87,7 +87,7 @@ OS_PopupViewContainer::OS_PopupViewContainer(bool inNoBackground, bool inDoubleB
 
 void OS_PopupViewContainer::UI_Draw(drawbot::Drawbot* inDrawbot) {
   const drawbot::ColorRGBA transparent{0.0f, 0.0f, 0.0f, 0.0f};
-  const drawbot::ColorRGBA background = mNoBackground ? transparent : GetColor(kPanelBackgroundColor);
+  const drawbot::ColorRGBA background = mNoBackground ? transparent : GetThemeColor(kPanelBackgroundColor);
   UI_DispatchDrawFromRoot(&background, inDrawbot, mDoubleBuffered);
 }
 
