@@ -51,18 +51,26 @@ class MonitorInfo : private boost::noncopyable {
   std::vector<Rect> mRects;
 };
 
+// Colour-managed drawing splits its rectangles at the borders of these
+// monitors: the library installs a reader of the native layer's monitors as
+// the drawing layer's monitor source when it is loaded.
 class OS_MonitorInfo : public MonitorInfo {
  public:
   // Reads the monitors at once.
   OS_MonitorInfo();
 
   void Update() override;
-  // The index of the platform's monitor for a rectangle.
+  // The index of the platform's monitor for a rectangle: the one whose whole
+  // screen holds most of it (the earlier on a tie), else the nearest. Work
+  // areas may coincide where screens do not, so they cannot tell monitors
+  // apart.
   std::size_t GetMonitorIDFromRect(const Rect& inRect) const;
 
  private:
-  // Called once a monitor during Update; adds its work area.
-  static bool MonitorEnumProc(const Rect& inWorkArea, OS_MonitorInfo* inSelf);
+  // Called once a monitor during Update; adds its work area and its screen.
+  static bool MonitorEnumProc(const Rect& inWorkArea, const Rect& inBounds, OS_MonitorInfo* inSelf);
+
+  std::vector<Rect> mBounds;  // the whole screen of each entry of mRects
 };
 
 }  // namespace norvik::utility

@@ -2,6 +2,7 @@
 // the monitors read from the native layer.
 #include <gtest/gtest.h>
 
+#include "drawbot/Drawbot.h"
 #include "tarsel/PropListUtils.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "utility/MonitorInfo.h"
@@ -94,6 +95,33 @@ TEST(MonitorInfoTest, TheNativeFormReadsTheWorkAreasOfTheLayerPrimaryFirst) {
   system.SetMonitors({{Rect(0, 0, 800, 600), Rect(0, 0, 800, 600)}});
   monitors.Update();
   EXPECT_EQ(monitors.GetMonitorCount(), 1u);
+}
+
+TEST(MonitorInfoTest, MonitorsWithEqualWorkAreasKeepTheirOwnIdentities) {
+  ui::HeadlessWindowSystem system;
+  system.Install();
+  // A work-area hint that reaches over both screens leaves each its own
+  // screen; a clamped one can leave two screens with the same work area.
+  system.SetMonitors({{Rect(0, 0, 1000, 800), Rect(0, 0, 1000, 800)},
+                      {Rect(0, 800, 1000, 800), Rect(0, 0, 1000, 800)}});
+  OS_MonitorInfo monitors;
+  EXPECT_EQ(monitors.GetMonitorIDFromRect(Rect(100, 900, 50, 50)), 1u);
+  EXPECT_EQ(monitors.GetMonitorIDFromRect(Rect(100, 100, 50, 50)), 0u);
+}
+
+TEST(MonitorInfoTest, ColourManagedDrawingSplitsAtTheNativeLayersMonitors) {
+  ui::HeadlessWindowSystem system;
+  system.Install();
+  system.SetMonitors({{Rect(0, 0, 1000, 800), Rect(0, 0, 1000, 780)},
+                      {Rect(1000, 0, 600, 800), Rect(1000, 0, 600, 800)}});
+  const auto pieces = drawbot::SubdivideByMonitor(Rect(900, 700, 200, 200));
+  ASSERT_EQ(pieces.size(), 2u);
+  EXPECT_EQ(pieces[0].first, Rect(900, 700, 100, 80)) << "cut at the first monitor's work area";
+  EXPECT_EQ(pieces[1].first, Rect(1000, 700, 100, 100));
+  EXPECT_NE(pieces[0].second, pieces[1].second);
+
+  system.SetMonitors({{Rect(0, 0, 1000, 800), Rect(0, 0, 1000, 800)}});
+  EXPECT_EQ(drawbot::SubdivideByMonitor(Rect(900, 700, 200, 200)).size(), 1u) << "monitors are read at each split";
 }
 
 TEST(MonitorInfoTest, WithoutAPlatformOneMonitorCoversEverything) {

@@ -1,8 +1,10 @@
 #include "utility/MonitorInfo.h"
 
 #include <algorithm>
+#include <memory>
 #include <string>
 
+#include "drawbot/Drawbot.h"
 #include "tarsel/PropListUtils.h"
 #include "ui/OS_NativeLayer.h"
 
@@ -28,7 +30,7 @@ long long DistanceSquared(const MonitorInfo::Rect& inRect, const MonitorInfo::Po
   return static_cast<long long>(dx) * dx + static_cast<long long>(dy) * dy;
 }
 
-MonitorInfo::Rect Nearest(const std::vector<MonitorInfo::Rect>& inRects, const MonitorInfo::Point& inPoint) {
+std::size_t NearestIndex(const std::vector<MonitorInfo::Rect>& inRects, const MonitorInfo::Point& inPoint) {
   std::size_t best = 0;
   long long bestDistance = -1;
   for (std::size_t i = 0; i < inRects.size(); ++i) {
@@ -38,7 +40,27 @@ MonitorInfo::Rect Nearest(const std::vector<MonitorInfo::Rect>& inRects, const M
       best = i;
     }
   }
-  return inRects[best];
+  return best;
+}
+
+MonitorInfo::Rect Nearest(const std::vector<MonitorInfo::Rect>& inRects, const MonitorInfo::Point& inPoint) {
+  return inRects[NearestIndex(inRects, inPoint)];
+}
+
+// The rectangle that holds most of inRect, the earlier on equal areas, else
+// the nearest to its centre.
+std::size_t BestIndex(const std::vector<MonitorInfo::Rect>& inRects, const MonitorInfo::Rect& inRect) {
+  if (inRects.size() == 1) return 0;
+  long long bestArea = 0;
+  std::size_t best = inRects.size();
+  for (std::size_t i = 0; i < inRects.size(); ++i) {
+    const long long area = Area(inRects[i].Intersection(inRect));
+    if (area > bestArea) {
+      bestArea = area;
+      best = i;
+    }
+  }
+  return best < inRects.size() ? best : NearestIndex(inRects, inRect.Center());
 }
 
 }  // namespace
@@ -69,18 +91,7 @@ MonitorInfo::Rect MonitorInfo::GetMonitorRectFromPoint(const Point& inPoint) con
 }
 
 MonitorInfo::Rect MonitorInfo::GetMonitorRectFromRect(const Rect& inRect) const {
-  if (mRects.size() == 1) return mRects.front();
-  long long bestArea = 0;
-  const Rect* best = nullptr;
-  for (const Rect& r : mRects) {
-    const long long area = Area(r.Intersection(inRect));
-    if (area > bestArea) {
-      bestArea = area;
-      best = &r;
-    }
-  }
-  if (best) return *best;
-  return Nearest(mRects, inRect.Center());
+  return mRects[BestIndex(mRects, inRect)];
 }
 
 MonitorInfo::Point MonitorInfo::GetMaxBottomRight() const {
@@ -125,25 +136,61 @@ void MonitorInfo::SaveToPropList(tarsel::proplist::PropList& outList) const {
 
 OS_MonitorInfo::OS_MonitorInfo() { Update(); }
 
-bool OS_MonitorInfo::MonitorEnumProc(const Rect& inWorkArea, OS_MonitorInfo* inSelf) {
-  if (inWorkArea.width > 0 && inWorkArea.height > 0) inSelf->mRects.push_back(inWorkArea);
+bool OS_MonitorInfo::MonitorEnumProc(const Rect& inWorkArea, const Rect& inBounds, OS_MonitorInfo* inSelf) {
+  if (inWorkArea.width > 0 && inWorkArea.height > 0) {
+    inSelf->mRects.push_back(inWorkArea);
+    inSelf->mBounds.push_back(inBounds.width > 0 && inBounds.height > 0 ? inBounds : inWorkArea);
+  }
   return true;
 }
 
 void OS_MonitorInfo::Update() {
   mRects.clear();
+  mBounds.clear();
   if (const ui::OS_NativeLayer* layer = ui::GetNativeLayer()) {
     for (const ui::OS_Monitor& monitor : layer->GetMonitors())
-      if (!MonitorEnumProc(monitor.workArea, this)) break;
+      if (!MonitorEnumProc(monitor.workArea, monitor.bounds, this)) break;
   }
-  if (mRects.empty()) mRects.push_back(GetUnboundedRect());
+  if (mRects.empty()) {
+    mRects.push_back(GetUnboundedRect());
+    mBounds.push_back(GetUnboundedRect());
+  }
 }
 
-std::size_t OS_MonitorInfo::GetMonitorIDFromRect(const Rect& inRect) const {
-  const Rect monitor = GetMonitorRectFromRect(inRect);
-  for (std::size_t i = 0; i < mRects.size(); ++i)
-    if (mRects[i] == monitor) return i;
-  return 0;
-}
+std::size_t OS_MonitorInfo::GetMonitorIDFromRect(const Rect& inRect) const { return BestIndex(mBounds, inRect); }
+
+namespace {
+
+// The drawing layer's view of the monitors: read afresh for every split, so
+// that a monitor plugged in or a changed work area counts at the next paint.
+// A monitor's identity is the address of its slot, distinct for each index.
+class NativeMonitorSource : public drawbot::MonitorSource {
+ public:
+  long GetMonitorCount() const override {
+    if (!mInfo)
+      mInfo = std::make_unique<OS_MonitorInfo>();
+    else
+      mInfo->Update();
+    mSlots.resize(mInfo->GetMonitorCount());
+    return static_cast<long>(mInfo->GetMonitorCount());
+  }
+  bool GetMonitorRect(long inIndex, tarsel::geom::RectT<long>* outRect) const override {
+    return mInfo && inIndex >= 0 && mInfo->GetMonitorRect(static_cast<std::size_t>(inIndex), *outRect);
+  }
+  void const* GetMonitorIDFromRect(tarsel::geom::RectT<long> const& inRect) const override {
+    if (!mInfo || mSlots.empty()) return nullptr;
+    const std::size_t index = mInfo->GetMonitorIDFromRect(inRect);
+    return index < mSlots.size() ? &mSlots[index] : nullptr;
+  }
+
+ private:
+  mutable std::unique_ptr<OS_MonitorInfo> mInfo;
+  mutable std::vector<char> mSlots;
+};
+
+NativeMonitorSource sNativeMonitors;
+[[maybe_unused]] const bool sInstalled = (drawbot::SetMonitorSource(&sNativeMonitors), true);
+
+}  // namespace
 
 }  // namespace norvik::utility
