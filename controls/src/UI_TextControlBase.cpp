@@ -4,6 +4,7 @@
 #include <map>
 
 #include "controls/UI_ControlView.h"
+#include "drawbot/DrawHelpers.h"
 #include "drawbot/Drawbot.h"
 #include "drawbot/DrawbotWrappers.h"
 #include "drawbot/FontFamilies.h"
@@ -66,12 +67,10 @@ void DrawControlLabel(const DrawParameters& inParams, const DrawTextControlBaseP
   const bool disabled = inParams.GetControlState().Test(UI_ControlView::kStateDisabled);
   drawbot::BrushP brush(supplier, LabelColor(inParams, disabled));
   if (!font || !brush) return;
-  const float ascent = font->GetAscent(), descent = font->GetDescent();
-  const float baseline = inRect.top + (inRect.height - (ascent + descent)) / 2 + ascent;
   float x = inRect.left;
   if (inText.GetTextAlignment() == drawbot::kTextAlignCenter) x += inRect.width / 2;
   if (inText.GetTextAlignment() == drawbot::kTextAlignRight) x += inRect.width;
-  const tarsel::geom::PointT<float> at(x, std::round(baseline));
+  const tarsel::geom::PointT<float> at(x, GetFontBaseline(font, inRect));
   const std::int64_t mnemonic = inParams.GetMnemonicLocation();
   if (inParams.GetAllowMnemonics() && inParams.GetDisplayMnemonics() && mnemonic >= 0 &&
       static_cast<std::size_t>(mnemonic) < text.size()) {

@@ -6,6 +6,9 @@
 
 #include "controls/DrawParameters.h"
 #include "controls/UI_Button.h"
+#include "controls/UI_TextControlBase.h"
+#include "drawbot/Drawbot.h"
+#include "support/drawbot/RecordingSupplier.h"
 #include "support/controls/ControlTestSupport.h"
 
 namespace norvik::controls::test {
@@ -169,6 +172,23 @@ TEST_F(ControlBaseTest, ParametersFromAButtonCarryItsStateRectangleAndColourMap)
   EXPECT_EQ(UI_GetColorFromChangeMap(20, params.GetColorChangeMap()), 18u);
   EXPECT_EQ(UI_GetColorFromChangeMap(21, params.GetColorChangeMap()), 21u);
   EXPECT_EQ(params.GetMnemonicLocation(), -1);
+}
+
+TEST_F(ControlBaseTest, LabelsSitOnTheSizeBaselineUnlessTheSettingAsksForTheFontsOwn) {
+  drawbot::testing::RecordingSupplier supplier;
+  boost::intrusive_ptr<drawbot::SurfaceInterface> surface(supplier.NewOffscreenSurface(60, 21, false));
+  drawbot::Drawbot drawbot(&supplier, surface.get());
+  DrawTextButtonParameters label;
+  label.SetText(u"Gain");
+  label.SetFontSize(10);  // the recording font's ascent is 8, its descent 2
+  auto baseline = [&] {
+    supplier.ClearCalls();
+    DrawControlLabel(label, label, RectF(0, 0, 60, 21), drawbot);
+    return supplier.GetCalls().empty() ? -1.0f : supplier.GetCalls().back().point.y;
+  };
+  EXPECT_EQ(baseline(), 15.0f) << "10 * 0.9 + 5.5, rounded";
+  manager.GetCustomSettingsManager()->Set("norvik.utils.FontDependentBaselines", true);
+  EXPECT_EQ(baseline(), 13.5f) << "5.5 + 8, not rounded";
 }
 
 }  // namespace

@@ -4,6 +4,7 @@
 
 #include <boost/make_shared.hpp>
 
+#include "drawbot/DrawHelpers.h"
 #include "tarsel/ThrowError.h"
 #include "ui/UI_Node.h"
 #include "ui/UI_Window.h"
@@ -12,7 +13,16 @@ namespace norvik::ui {
 
 namespace {
 UI_NodeManager* gManager = nullptr;
+
+// The drawing layer reads its switches ("norvik.utils.FontDependentBaselines")
+// from the manager in charge when it asks, and gets its default without one.
+bool ReadManagerSetting(char const* inKey, bool inDefault) {
+  const CustomSettingsManager* settings = gManager ? gManager->GetCustomSettingsManager() : nullptr;
+  return settings ? settings->GetBool(inKey, inDefault) : inDefault;
 }
+
+[[maybe_unused]] const bool sSettingReaderInstalled = (drawbot::SetBoolSettingReader(&ReadManagerSetting), true);
+}  // namespace
 
 UI_NodeManager::UI_NodeManager()
     : mCustomSettingsManager(std::make_unique<CustomSettingsManager>()),
