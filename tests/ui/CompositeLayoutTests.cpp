@@ -44,17 +44,6 @@ halvorn::place_data_t PlaceAt(float inX, float inY, float inW, float inH) {
 
 using CompositeLayout = ManagerTest;
 
-TEST_F(CompositeLayout, ARowMeasuresTheSumOfItsItemsWithTenBetweenThem) {
-  boost::intrusive_ptr<UI_Composite> row(new UI_Composite(layout_attributes_placement_t::placement_row));
-  row->AddChildNode(Sized(30, 10));
-  row->AddChildNode(Sized(20, 25));
-  row->AddChildNode(Sized(5, 5));
-  halvorn::extents_t e;
-  row->measure(e);
-  EXPECT_EQ(e.horizontal().length, 30 + 10 + 20 + 10 + 5);
-  EXPECT_EQ(e.vertical().length, 25);
-}
-
 TEST_F(CompositeLayout, AColumnStacksItsItemsAndHiddenItemsTakeNoRoom) {
   boost::intrusive_ptr<UI_Composite> column(new UI_Composite(layout_attributes_placement_t::placement_column));
   column->AddChildNode(Sized(30, 10));
@@ -67,14 +56,19 @@ TEST_F(CompositeLayout, AColumnStacksItsItemsAndHiddenItemsTakeNoRoom) {
   EXPECT_EQ(e.vertical().length, 10 + 10 + 15);
 }
 
-TEST_F(CompositeLayout, PlacingSetsTheCompositesRectAndLaysOutTheChildrenInsideIt) {
+TEST_F(CompositeLayout, ARowMeasuresItsItemsWithTenBetweenAndPlacesThemInsideItsRectangle) {
   boost::intrusive_ptr<UI_Composite> row(new UI_Composite(layout_attributes_placement_t::placement_row));
   auto a = Sized(30, 10);
   auto b = Sized(20, 25);
   row->AddChildNode(a);
   row->AddChildNode(b);
-  row->place(PlaceAt(100, 200, 60, 25));
-  EXPECT_EQ(row->UI_GetLocalRectF(true), RectF(100, 200, 60, 25));
+  row->AddChildNode(Sized(5, 5));
+  halvorn::extents_t e;
+  row->measure(e);
+  EXPECT_EQ(e.horizontal().length, 30 + 10 + 20 + 10 + 5);
+  EXPECT_EQ(e.vertical().length, 25);
+  row->place(PlaceAt(100, 200, 75, 25));
+  EXPECT_EQ(row->UI_GetLocalRectF(true), RectF(100, 200, 75, 25));
   EXPECT_EQ(a->UI_GetLocalRectF(true), RectF(0, 0, 30, 10));
   EXPECT_EQ(b->UI_GetLocalRectF(true), RectF(40, 0, 20, 25));
   EXPECT_EQ(row->get_placement().horizontal().position, 100);

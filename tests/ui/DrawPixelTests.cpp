@@ -62,24 +62,28 @@ class DrawPixels : public ManagerTest {
   PaintingViewP root, panel, leaf;
 };
 
-TEST_F(DrawPixels, TheDarkLookPaintsDarkFillsAndLightText) {
-  SetLook(0);
-  PixelImage image = Paint();
-  EXPECT_TRUE(PixelIs(image, 1, 1, theme->GetColor(2)));
-  EXPECT_TRUE(PixelIs(image, 6, 6, theme->GetColor(7)));
-  EXPECT_TRUE(PixelIs(image, 16, 12, theme->GetColor(1)));
-  EXPECT_LT(Red(image, 1, 1), 0x30);
-  EXPECT_GT(Red(image, 16, 12), 0xB0);
-  EXPECT_TRUE(drawbot::testing::MatchesReference(image, "ui/DrawTreeDark"));
-}
-
-TEST_F(DrawPixels, TheLightLookPaintsLightFillsAndDarkText) {
-  SetLook(1);
-  PixelImage image = Paint();
-  EXPECT_TRUE(PixelIs(image, 1, 1, ColorRGBA(1, 1, 1, 1)));
-  EXPECT_TRUE(PixelIs(image, 6, 6, ColorRGBA(0x9E / 255.0f, 0x9E / 255.0f, 0x9E / 255.0f, 1)));
-  EXPECT_TRUE(PixelIs(image, 16, 12, ColorRGBA(0x26 / 255.0f, 0x26 / 255.0f, 0x26 / 255.0f, 1)));
-  EXPECT_TRUE(drawbot::testing::MatchesReference(image, "ui/DrawTreeLight"));
+// One image per look: the fills and the text in the look's own colours, dark
+// fills under light text or the other way round, the same pixels through
+// the paint buffer, and the stored reference.
+TEST_F(DrawPixels, EachLookPaintsItsThemeColoursBufferedOrNotAsItsReference) {
+  const struct {
+    float brightness;
+    const char* reference;
+  } looks[] = {{0, "ui/DrawTreeDark"}, {1, "ui/DrawTreeLight"}};
+  for (const auto& look : looks) {
+    SCOPED_TRACE(look.reference);
+    SetLook(look.brightness);
+    PixelImage image = Paint();
+    EXPECT_TRUE(PixelIs(image, 1, 1, theme->GetColor(2)));
+    EXPECT_TRUE(PixelIs(image, 6, 6, theme->GetColor(7)));
+    EXPECT_TRUE(PixelIs(image, 16, 12, theme->GetColor(1)));
+    const bool dark = look.brightness < 0.5f;
+    EXPECT_EQ(Red(image, 1, 1) < 0x30, dark);
+    EXPECT_EQ(Red(image, 16, 12) > 0xB0, dark);
+    EXPECT_TRUE(drawbot::testing::MatchesReference(image, look.reference));
+    canvas.Clear(0x00FF00);
+    EXPECT_EQ(Paint(true).pixels, image.pixels) << "through the paint buffer";
+  }
 }
 
 TEST_F(DrawPixels, CachedViewsFollowTheSwitchFromDarkToLight) {
@@ -105,14 +109,6 @@ TEST_F(DrawPixels, ACacheShowsTheSamePixelsAsDrawingAfterAWholePixelScroll) {
   const PixelImage cached = Paint();
   EXPECT_EQ(leaf->draws, 2);  // the last paint of the leaf came from its cache
   EXPECT_EQ(cached.pixels, direct.pixels);
-}
-
-TEST_F(DrawPixels, BufferedPaintingGivesTheSamePixels) {
-  SetLook(1);
-  const PixelImage direct = Paint(false);
-  canvas.Clear(0x00FF00);
-  const PixelImage buffered = Paint(true);
-  EXPECT_EQ(buffered.pixels, direct.pixels);
 }
 
 TEST_F(DrawPixels, AViewThatClipsToItselfKeepsItsChildrenInside) {

@@ -10,16 +10,7 @@
 namespace norvik::ui {
 namespace {
 
-TEST(KeyboardCodeValue, PrintableCharacterSetsBit31AndKeepsTheCharacter) {
-  KeyboardCode c = KeyboardCode::CreateFromKeyboardChar('Q');
-  EXPECT_EQ(c.GetValue(), 0x80000000u | 'Q');
-  EXPECT_TRUE(c.IsPrintable());
-  EXPECT_FALSE(c.IsExtended());
-  EXPECT_EQ(c.GetCharacter(), 'Q');
-  EXPECT_EQ(c.GetControlCode(), 0);
-}
-
-TEST(KeyboardCodeValue, ExtendedBitIsDroppedOnlyWhenAskedTo) {
+TEST(KeyboardCodeValue, ACharacterSetsBit31AndTheExtendedBitIsDroppedOnlyWhenAskedTo) {
   KeyboardCode c = KeyboardCode::CreateFromKeyboardChar('7', true);
   EXPECT_TRUE(c.IsExtended());
   EXPECT_EQ(c.GetValue(true), 0xC0000000u | '7');
@@ -106,14 +97,11 @@ TEST(ExtendedKeys, KeypadAndItsNavigationKeysAreExtended) {
   }
 }
 
-TEST(TypedCharacters, ValuesBelowSpaceBecomeZero) {
+TEST(TypedCharacters, ValuesBelowSpaceBecomeZeroAndAnEmptyListGetsOneZero) {
   std::vector<unsigned short> chars{'a', 13, 31, 32, 127, 0x4E2D, 1};
   KeyboardEvent::ValidateKeyChars(chars);
   EXPECT_EQ(chars, (std::vector<unsigned short>{'a', 0, 0, 32, 127, 0x4E2D, 0}));
-}
-
-TEST(TypedCharacters, AnEmptyListGetsOneZeroEntry) {
-  std::vector<unsigned short> chars;
+  chars.clear();
   KeyboardEvent::ValidateKeyChars(chars);
   EXPECT_EQ(chars, std::vector<unsigned short>{0});
 }

@@ -28,49 +28,44 @@ class KeyboardDispatchTest : public DispatchTest {
   EventViewP panel, field;
 };
 
-TEST_F(KeyboardDispatchTest, AKeyGoesToTheFocusedNodeAndThenUpTheChainWithTheFocusedNodeAsTarget) {
-  EXPECT_FALSE(Send(field.get(), KeyDownEvent('A', 'A')));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)", "panel.key(field)", "root.key(field)"));
-}
-
-TEST_F(KeyboardDispatchTest, TheFirstNodeThatHandlesTheKeyEndsTheWalk) {
-  panel->handlesKey = true;
-  EXPECT_TRUE(Send(field.get(), KeyDownEvent('A', 'A')));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)", "panel.key(field)"));
-}
-
-TEST_F(KeyboardDispatchTest, DisabledNodesArePassedOverButTheWalkGoesOn) {
-  panel->UI_SetSelfDisabled(true);
-  Send(field.get(), KeyDownEvent('A', 'A'));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)", "root.key(field)"));
-  log.Clear();
-  panel->UI_SetSelfDisabled(false);
-  panel->UI_SetDisabled(true);
-  Send(field.get(), KeyDownEvent('A', 'A'));
-  EXPECT_THAT(log.Texts(), ElementsAre("root.key(field)"));
-}
-
-TEST_F(KeyboardDispatchTest, ANodeCanKeepTypedCharactersFromClimbingPastIt) {
-  panel->passCharsToParent = false;
-  EXPECT_FALSE(Send(field.get(), CharEvent('x')));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)", "panel.key(field)"));
-  log.Clear();
-  Send(field.get(), KeyDownEvent('X', 'X'));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)", "panel.key(field)", "root.key(field)"))
-      << "key downs still climb";
-}
-
-TEST_F(KeyboardDispatchTest, ADisabledNodeStillKeepsCharactersFromClimbing) {
-  panel->passCharsToParent = false;
-  panel->UI_SetSelfDisabled(true);
-  Send(field.get(), CharEvent('x'));
-  EXPECT_THAT(log.Texts(), ElementsAre("field.key(field)"));
-}
-
-TEST_F(KeyboardDispatchTest, WithNoFocusedNodeTheKeyGoesToTheWindow) {
-  // The window sends its keys to itself when nothing inside has focus.
-  EXPECT_FALSE(Send(root.get(), KeyDownEvent('A', 'A')));
-  EXPECT_THAT(log.Texts(), ElementsAre("root.key(root)"));
+// Each row sets the panel between the focused field and the root up, sends
+// one event, and lists the nodes that saw it, in order.
+TEST_F(KeyboardDispatchTest, AKeyClimbsFromTheFocusedNodeUntilHandledPassingOverDisabledNodes) {
+  struct Row {
+    const char* name;
+    std::function<void(EventView&)> setUp;
+    bool toRoot;  // sent with nothing focused: the window sends to itself
+    KeyboardEvent event;
+    std::vector<std::string> seen;
+  };
+  const KeyboardEvent a = KeyDownEvent('A', 'A');
+  const auto keepChars = [](EventView& p) { p.passCharsToParent = false; };
+  const Row rows[] = {
+      {"unhandled", nullptr, false, a, {"field.key(field)", "panel.key(field)", "root.key(field)"}},
+      {"handled by the panel", [](EventView& p) { p.handlesKey = true; }, false, a,
+       {"field.key(field)", "panel.key(field)"}},
+      {"self-disabled panel", [](EventView& p) { p.UI_SetSelfDisabled(true); }, false, a,
+       {"field.key(field)", "root.key(field)"}},
+      {"disabled panel", [](EventView& p) { p.UI_SetDisabled(true); }, false, a, {"root.key(field)"}},
+      {"characters kept", keepChars, false, CharEvent('x'), {"field.key(field)", "panel.key(field)"}},
+      {"key downs still climb", keepChars, false, KeyDownEvent('X', 'X'),
+       {"field.key(field)", "panel.key(field)", "root.key(field)"}},
+      {"characters kept by a disabled panel",
+       [](EventView& p) { p.passCharsToParent = false, p.UI_SetSelfDisabled(true); }, false, CharEvent('x'),
+       {"field.key(field)"}},
+      {"nothing focused", nullptr, true, a, {"root.key(root)"}},
+  };
+  for (const Row& row : rows) {
+    SCOPED_TRACE(row.name);
+    EventViewP rowPanel = View("panel", 20, 20, 100, 100, root.get());
+    EventViewP rowField = View("field", 10, 10, 30, 30, rowPanel.get());
+    if (row.setUp) row.setUp(*rowPanel);
+    log.Clear();
+    const bool handled = Send(row.toRoot ? root.get() : rowField.get(), row.event);
+    EXPECT_EQ(handled, rowPanel->handlesKey) << "only a handler ends the walk with a yes";
+    EXPECT_EQ(log.Texts(), row.seen);
+    root->ChildRemove(rowPanel.get());
+  }
 }
 
 TEST_F(KeyboardDispatchTest, WithNoNodeAtAllOnlyTheFiltersSeeTheKey) {
@@ -229,14 +224,6 @@ TEST_F(ModKeyNotifierTest, FunctionsRunInOrderOnlyWhenTheModifiersChangeAndTheNe
   notifier.DispatchModKeyEvent(ModifierKeys(kModKeyShift));
   EXPECT_THAT(*calls, ElementsAre("first:2:stored0", "second:2:stored0"));
   EXPECT_EQ(notifier.GetModKeys(), ModifierKeys(kModKeyShift));
-}
-
-TEST_F(ModKeyNotifierTest, EveryKeyboardEventPassesItsModifiersThroughTheNotifier) {
-  UI_ModKeyNotifier::Get().InstallModKeyChangedFunction(Recorder("n"));
-  UI_Node::UI_DispatchKeyboardEvent(root.get(), KeyDownEvent(17, 0, ModifierKeys(kModKeyCtrl)));
-  UI_Node::UI_DispatchKeyboardEvent(root.get(), KeyDownEvent('S', 'S', ModifierKeys(kModKeyCtrl)));
-  UI_Node::UI_DispatchKeyboardEvent(root.get(), KeyUpEvent(17, 0));
-  EXPECT_THAT(*calls, ElementsAre("n:4:stored0", "n:0:stored4"));
 }
 
 TEST_F(ModKeyNotifierTest, ComingToTheFrontDispatchesTheKeyboardsCurrentState) {

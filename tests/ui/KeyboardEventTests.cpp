@@ -19,20 +19,6 @@ KeyboardEvent KeyDown(short inOSCode, unsigned short inCharacter, ModifierKeys i
                        OS_Event(1, kOSMsgKeyDown, static_cast<std::uintptr_t>(inOSCode), 0));
 }
 
-TEST(KeyboardEventForms, KeyFormKeepsItsFieldsAndCleansTheCharacter) {
-  OS_Event os(5, kOSMsgKeyUp, 13, 0x1C0001, 99);
-  KeyboardEvent e(KeyboardEvent::kActionKeyUp, 13, 13, ModifierKeys(kModKeyCtrl), true, os);
-  EXPECT_EQ(e.GetAction(), KeyboardEvent::kActionKeyUp);
-  EXPECT_TRUE(e.IsActionKeyUp());
-  EXPECT_FALSE(e.IsActionKeyDown());
-  EXPECT_EQ(e.GetNumCharacters(), 1u);
-  EXPECT_EQ(e.GetCharacter(0), 0);
-  EXPECT_EQ(e.GetOSCode(), 13);
-  EXPECT_EQ(e.GetModKey(), ModifierKeys(kModKeyCtrl));
-  EXPECT_TRUE(e.IsRepeat());
-  EXPECT_EQ(e.GetOSEvent().GetTime(), 99);
-}
-
 TEST(KeyboardEventForms, CharacterFormIsACharActionWithNoKey) {
   KeyboardEvent e(std::vector<unsigned short>{'h', 'i', 9}, ModifierKeys(kModKeyShift), false, OS_Event());
   EXPECT_TRUE(e.IsActionKeyChar());
@@ -116,20 +102,6 @@ TEST(ShortcutCharacter, IsComputedOnceAndKeptInTheEvent) {
   EXPECT_EQ(e.GetCode().GetCharacter(), 0x010E);
 }
 
-TEST(KeyCode, ControlKeysGiveTheirControlCode) {
-  EXPECT_EQ(KeyDown(27, 27).GetCode(), KeyboardCode::CreateFromControlCode(kControlCodeEscape));
-  EXPECT_EQ(KeyDown(115, 0).GetCode(), KeyboardCode::CreateFromControlCode(kControlCodeF1 + 3));
-}
-
-TEST(KeyCode, KeypadNavigationKeysCarryTheExtendedBit) {
-  KeyboardCode keypadHome = KeyDown(36, 0).GetCode();
-  KeyboardCode blockHome = KeyDown(-36, 0).GetCode();
-  EXPECT_TRUE(keypadHome.IsExtended());
-  EXPECT_FALSE(blockHome.IsExtended());
-  EXPECT_EQ(keypadHome.GetControlCode(), kControlCodeHome);
-  EXPECT_EQ(keypadHome.GetValue(false), blockHome.GetValue(false));
-}
-
 TEST(KeyCode, PrintableKeysGiveTheirShortcutCharacter) {
   KeyboardCode q = KeyDown('Q', 'q').GetCode();
   EXPECT_TRUE(q.IsPrintable());
@@ -146,12 +118,6 @@ TEST(KeyCode, AKeyWithNeitherCharacterNorControlCodeHasNoCodeAndMatchesNothing) 
   EXPECT_FALSE(e.CompareCode(KeyboardCode()));
   EXPECT_FALSE(e.CompareShortcut(KeyboardCode(), {}));
   EXPECT_FALSE(e.CompareShortcut(KeyboardCode(65535), {}));
-}
-
-TEST(KeyCode, AnEventWithoutAKeyReadsAsClear) {
-  // -1 is both "no key" and the extended Clear key.
-  KeyboardEvent e(std::vector<unsigned short>{'a'}, {}, false, OS_Event());
-  EXPECT_EQ(e.GetCode().GetControlCode(), kControlCodeClear);
 }
 
 TEST(ShortcutMatching, ModifiersMustMatchExactlyWithCapsLockIgnored) {
@@ -189,15 +155,6 @@ TEST(PostActionFlush, OrdinaryKeysLeaveTheQueueAlone) {
   FlushPostActionKeyEvents(KeyDown('F', 'f'));
   FlushPostActionKeyEvents(KeyboardEvent(OS_Event(1, kOSMsgSysChar, 'f', 0)));
   EXPECT_EQ(platform.GetQueue().size(), 2u);
-}
-
-TEST(ModifierState, ComesFromTheInstalledPlatform) {
-  EXPECT_TRUE(utility::GetCurrentModKeys().IsEmpty()) << "the quiet platform holds no keys";
-  FakeInputPlatform platform;
-  platform.mRecentModKeys = ModifierKeys(kModKeyShift);
-  platform.mCurrentModKeys = ModifierKeys(kModKeyAlt | kModKeyCapsLock);
-  EXPECT_EQ(utility::GetRecentEventModKeys(), ModifierKeys(kModKeyShift));
-  EXPECT_EQ(utility::GetCurrentModKeys(), ModifierKeys(kModKeyAlt | kModKeyCapsLock));
 }
 
 }  // namespace

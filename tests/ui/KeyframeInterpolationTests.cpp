@@ -20,66 +20,51 @@ class KeyframeInterpolation : public ::testing::Test {
   KeyframeThemeEditorP editor{new KeyframeThemeEditor()};
 };
 
-TEST_F(KeyframeInterpolation, AKeyReturnsItsOwnColourExactly) {
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.2f, 1, false));
-  editor->SetColorKeyValue(5, 1, KeyValue(0, 0, 0.9f, 0.5f, false));
-  EXPECT_TRUE(ColorNear(At(5, 0), Grey(0.2f)));
-  EXPECT_TRUE(ColorNear(At(5, 1), Grey(0.9f, 0.5f)));
-}
-
-TEST_F(KeyframeInterpolation, AUnitRampMovesValueHueAndSaturationTogether) {
-  // With keys at 0 and 1 whose values are 0 and 1, v equals t, so hue and
-  // saturation move by the same factor as value.
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0, 1, false));
-  editor->SetColorKeyValue(5, 1, KeyValue(120, 1, 1, 1, false));
-  EXPECT_TRUE(ColorNear(At(5, 0.5f), drawbot::HSBtoRGB(60.0f, 0.5f, 0.5f, 1)));
-}
-
-TEST_F(KeyframeInterpolation, HueAndSaturationFollowTheInterpolatedValueNotTheBrightness) {
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.2f, 1, false));
-  editor->SetColorKeyValue(5, 1, KeyValue(240, 1, 0.4f, 1, false));
-  // At t = 0.5 the value is 0.3, so hue and saturation move by 0.3, not 0.5.
-  EXPECT_TRUE(ColorNear(At(5, 0.5f), drawbot::HSBtoRGB(72.0f, 0.3f, 0.3f, 1)));
-}
-
-TEST_F(KeyframeInterpolation, AlphaMovesLinearlyWithBrightness) {
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.5f, 0.2f, false));
-  editor->SetColorKeyValue(5, 1, KeyValue(0, 0, 0.5f, 1, false));
-  EXPECT_NEAR(At(5, 0.25f).alpha, 0.4f, 1e-5f);
-}
-
-TEST_F(KeyframeInterpolation, AHeldKeyLastsUpToButNotIncludingTheNextKey) {
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.2f, 1, true));
-  editor->SetColorKeyValue(5, 0.5f, KeyValue(0, 0, 0.8f, 1, false));
-  editor->SetColorKeyValue(5, 1, KeyValue(0, 0, 1.0f, 1, false));
-  EXPECT_TRUE(ColorNear(At(5, 0.3f), Grey(0.2f)));
-  EXPECT_TRUE(ColorNear(At(5, 0.4999f), Grey(0.2f)));
-  EXPECT_TRUE(ColorNear(At(5, 0.5f), Grey(0.8f)));
-  EXPECT_TRUE(ColorNear(At(5, 0.75f), Grey(0.9f)));
-}
-
-TEST_F(KeyframeInterpolation, AboveTheLastKeyTheLastColourStandsCapped) {
-  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.1f, 1, false));
-  editor->SetColorKeyValue(5, 0.5f, KeyValue(0, 0, 1.5f, 2.0f, false));
-  EXPECT_TRUE(ColorNear(At(5, 0.9f), Grey(1.0f, 1.0f)));
-}
-
-TEST_F(KeyframeInterpolation, HueIsTruncatedAndReducedModulo360) {
-  editor->SetColorKeyValue(5, 0, KeyValue(370, 1, 1, 1, false));
-  EXPECT_TRUE(ColorNear(At(5, 0.5f), drawbot::HSBtoRGB(10.0f, 1.0f, 1.0f, 1)));
-  editor->SetColorKeyValue(6, 0, KeyValue(359.9f, 1, 1, 1, false));
-  EXPECT_TRUE(ColorNear(At(6, 0.5f), drawbot::HSBtoRGB(359.0f, 1.0f, 1.0f, 1)));
-}
-
-TEST_F(KeyframeInterpolation, ZeroSaturationGivesGreyWhateverTheHue) {
-  editor->SetColorKeyValue(5, 0, KeyValue(200, 0, 0.4f, 1, false));
-  EXPECT_TRUE(ColorNear(At(5, 0.7f), Grey(0.4f)));
-}
-
-TEST_F(KeyframeInterpolation, WithoutATrackTheColourIsLeftAsGiven) {
-  drawbot::ColorRGBA c(0.3f, 0.6f, 0.9f, 0.5f);
-  editor->InterpolateColor(77, 0.5f, c);
-  EXPECT_EQ(c, drawbot::ColorRGBA(0.3f, 0.6f, 0.9f, 0.5f));
+// Each row is one track of keys (at t) and the colour it gives at one
+// brightness; a track id with no keys leaves the given colour alone.
+TEST_F(KeyframeInterpolation, ATrackGivesItsKeysAndInterpolatesHoldsAndCapsBetweenThem) {
+  struct Key {
+    float t;
+    KeyValue value;
+  };
+  struct Row {
+    const char* why;
+    std::vector<Key> keys;
+    float t;
+    drawbot::ColorRGBA expected;
+  };
+  const Row rows[] = {
+      {"a key gives its own colour", {{0, KeyValue(0, 0, 0.2f, 1, false)}, {1, KeyValue(0, 0, 0.9f, 0.5f, false)}}, 1,
+       Grey(0.9f, 0.5f)},
+      {"on a unit ramp value, hue and saturation move together",
+       {{0, KeyValue(0, 0, 0, 1, false)}, {1, KeyValue(120, 1, 1, 1, false)}}, 0.5f,
+       drawbot::HSBtoRGB(60.0f, 0.5f, 0.5f, 1)},
+      {"hue and saturation follow the interpolated value (0.3), not the brightness",
+       {{0, KeyValue(0, 0, 0.2f, 1, false)}, {1, KeyValue(240, 1, 0.4f, 1, false)}}, 0.5f,
+       drawbot::HSBtoRGB(72.0f, 0.3f, 0.3f, 1)},
+      {"alpha moves linearly", {{0, KeyValue(0, 0, 0.5f, 0.2f, false)}, {1, KeyValue(0, 0, 0.5f, 1, false)}}, 0.25f,
+       Grey(0.5f, 0.4f)},
+      {"a held key lasts up to the next key",
+       {{0, KeyValue(0, 0, 0.2f, 1, true)}, {0.5f, KeyValue(0, 0, 0.8f, 1, false)}}, 0.4999f, Grey(0.2f)},
+      {"the next key after a hold", {{0, KeyValue(0, 0, 0.2f, 1, true)}, {0.5f, KeyValue(0, 0, 0.8f, 1, false)}},
+       0.5f, Grey(0.8f)},
+      {"between the keys after a hold",
+       {{0, KeyValue(0, 0, 0.2f, 1, true)}, {0.5f, KeyValue(0, 0, 0.8f, 1, false)}, {1, KeyValue(0, 0, 1, 1, false)}},
+       0.75f, Grey(0.9f)},
+      {"above the last key its colour stands, capped",
+       {{0, KeyValue(0, 0, 0.1f, 1, false)}, {0.5f, KeyValue(0, 0, 1.5f, 2.0f, false)}}, 0.9f, Grey(1.0f, 1.0f)},
+      {"hue reduced modulo 360", {{0, KeyValue(370, 1, 1, 1, false)}}, 0.5f, drawbot::HSBtoRGB(10.0f, 1.0f, 1.0f, 1)},
+      {"hue truncated", {{0, KeyValue(359.9f, 1, 1, 1, false)}}, 0.5f, drawbot::HSBtoRGB(359.0f, 1.0f, 1.0f, 1)},
+      {"zero saturation is grey whatever the hue", {{0, KeyValue(200, 0, 0.4f, 1, false)}}, 0.7f, Grey(0.4f)},
+      {"no track", {}, 0.5f, drawbot::ColorRGBA(0.3f, 0.6f, 0.9f, 0.5f)},
+  };
+  for (const Row& row : rows) {
+    editor->ClearColorKeyValues();
+    for (const Key& key : row.keys) editor->SetColorKeyValue(5, key.t, key.value);
+    drawbot::ColorRGBA c(0.3f, 0.6f, 0.9f, 0.5f);
+    editor->InterpolateColor(5, row.t, c);
+    EXPECT_TRUE(ColorNear(c, row.expected)) << row.why;
+  }
 }
 
 TEST_F(KeyframeInterpolation, BrightnessRecomputesTrackedColoursAndRestoresThePaletteElsewhere) {
@@ -121,30 +106,20 @@ TEST_F(KeyframeInterpolation, ClearingTracksRemovesThem) {
   EXPECT_TRUE(editor->GetColorTrack(6).empty());
 }
 
-class SourceBrightness : public KeyframeInterpolation {
- protected:
-  void SetUp() override {
-    editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.1f, 1, false));
-    editor->SetColorKeyValue(5, 1, KeyValue(0, 0, 0.9f, 1, false));
-  }
-};
-
-TEST_F(SourceBrightness, InvertsTheTrackBetweenKeys) {
-  EXPECT_NEAR(editor->GetSourceBrightness(5, Grey(0.5f)), 0.5f, 1e-5f);
-  EXPECT_NEAR(editor->GetSourceBrightness(5, Grey(0.3f)), 0.25f, 1e-5f);
-}
-
-TEST_F(SourceBrightness, AnswersTheKeyOfAMatchingOrFirstFrame) {
-  EXPECT_FLOAT_EQ(editor->GetSourceBrightness(5, Grey(0.9f)), 1.0f);
-  EXPECT_FLOAT_EQ(editor->GetSourceBrightness(5, Grey(0.05f)), 0.0f);
-}
-
-TEST_F(SourceBrightness, BeyondTheBrightestFrameAnswersTheLastKey) {
-  EXPECT_FLOAT_EQ(editor->GetSourceBrightness(5, Grey(0.95f)), 1.0f);
-}
-
-TEST_F(SourceBrightness, WithoutATrackAnswersTheDefaultBrightness) {
-  EXPECT_FLOAT_EQ(editor->GetSourceBrightness(99, Grey(0.7f)), 0.25f);
+TEST_F(KeyframeInterpolation, TheSourceBrightnessOfAColourInvertsItsTrack) {
+  editor->SetColorKeyValue(5, 0, KeyValue(0, 0, 0.1f, 1, false));
+  editor->SetColorKeyValue(5, 1, KeyValue(0, 0, 0.9f, 1, false));
+  const struct {
+    std::uint64_t id;
+    float grey, expected;
+    const char* why;
+  } rows[] = {
+      {5, 0.5f, 0.5f, "between keys"},     {5, 0.3f, 0.25f, "between keys"},
+      {5, 0.9f, 1, "a matching frame"},    {5, 0.05f, 0, "below the first frame"},
+      {5, 0.95f, 1, "beyond the brightest frame"}, {99, 0.7f, 0.25f, "no track: the default brightness"},
+  };
+  for (const auto& row : rows)
+    EXPECT_NEAR(editor->GetSourceBrightness(row.id, Grey(row.grey)), row.expected, 1e-5f) << row.why;
 }
 
 TEST(KeyframeTint, DerivesHueSaturationAndGainFromTheTint) {

@@ -1,6 +1,8 @@
 // Mouse-over state: entering and leaving nodes as the mouse moves, the exit
 // events that left nodes hear, the leaf changing while it stays on the chain,
 // the mouse leaving a window, suspension, and hover invalidation.
+#include <optional>
+
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -27,25 +29,43 @@ class MouseOverTest : public DispatchTest {
   EventViewP a, a1, b;
 };
 
-TEST_F(MouseOverTest, MovingOntoANodeEntersItAndEveryAncestorRootFirst) {
-  MoveTo(PointF(25, 25));
-  EXPECT_EQ(manager.GetMouseOverLeafNode(), a1.get());
-  EXPECT_EQ(manager.GetMouseOverRootNode(), root.get());
-  EXPECT_TRUE(Over(root) && Over(a) && Over(a1));
-  EXPECT_FALSE(Over(b));
-  EXPECT_THAT(log.Texts(), ElementsAre("root.over+(-)", "a.over+(-)", "a1.over+(-)"));
-  EXPECT_TRUE(a1->UI_IsMouseOver(true));
-  EXPECT_FALSE(a->UI_IsMouseOver(true)) << "a is on the chain but not the leaf";
-}
-
-TEST_F(MouseOverTest, MovingToAnotherBranchLeavesTheOldTailAndEntersTheNewOneOnly) {
-  MoveTo(PointF(25, 25));
-  log.Clear();
-  MoveTo(PointF(110, 120));
-  EXPECT_EQ(manager.GetMouseOverLeafNode(), b.get());
-  EXPECT_FALSE(Over(a) || Over(a1));
-  EXPECT_TRUE(Over(root) && Over(b));
-  EXPECT_THAT(log.Texts(), ElementsAre("a.mouse(a)", "a1.mouse(a1)", "a.over-(-)", "a1.over-(-)", "b.over+(-)"));
+// Each row moves the mouse from one point (none: from outside) to another;
+// the nodes on the chain from the root to the new leaf, and only they, are
+// over, and only the leaf is over as the leaf.
+TEST_F(MouseOverTest, TheChainEntersAndLeavesOnlyTheNodesThatChangeRootFirst) {
+  struct Row {
+    const char* name;
+    std::optional<PointF> from;
+    PointF to;
+    const char* leaf;
+    std::vector<std::string> log;
+  };
+  const Row rows[] = {
+      {"onto a nested node", std::nullopt, PointF(25, 25), "a1", {"root.over+(-)", "a.over+(-)", "a1.over+(-)"}},
+      {"to another branch", PointF(25, 25), PointF(110, 120), "b",
+       {"a.mouse(a)", "a1.mouse(a1)", "a.over-(-)", "a1.over-(-)", "b.over+(-)"}},
+      {"within the leaf", PointF(25, 25), PointF(26, 27), "a1", {}},
+      {"from a child to its parent", PointF(25, 25), PointF(60, 60), "a", {"a1.mouse(a1)", "a1.over-(-)", "a.over+(-)"}},
+      {"from a parent into its child", PointF(60, 60), PointF(25, 25), "a1", {"a.over-(-)", "a1.over+(-)"}},
+  };
+  for (const Row& row : rows) {
+    SCOPED_TRACE(row.name);
+    if (row.from) MoveTo(*row.from);
+    log.Clear();
+    MoveTo(row.to);
+    EXPECT_EQ(log.Texts(), row.log);
+    UI_Node* leaf = manager.GetMouseOverLeafNode();
+    ASSERT_NE(leaf, nullptr);
+    EXPECT_EQ(leaf->UI_GetNodeID(), row.leaf);
+    EXPECT_EQ(manager.GetMouseOverRootNode(), root.get());
+    for (const EventViewP& v : {root, a, a1, b}) {
+      bool onChain = false;
+      for (UI_Node* n = leaf; n; n = n->UI_GetParentNode()) onChain |= n == v.get();
+      EXPECT_EQ(Over(v), onChain) << v->UI_GetNodeID();
+      EXPECT_EQ(v->UI_IsMouseOver(true), v.get() == leaf) << v->UI_GetNodeID();
+    }
+    MoveTo(PointF(-5, -5));  // out of the root again
+  }
 }
 
 TEST_F(MouseOverTest, NodesThatTheMouseLeavesHearAnUpdateEventInTheirOwnCoordinates) {
@@ -65,32 +85,6 @@ TEST_F(MouseOverTest, TheNotificationRunsOnlyOnceTheWholeChainIsConsistent) {
   a->onMouseOverChanged = [&](bool) { a1StillOverWhenATold = a1->UI_IsMouseOver(); };
   MoveTo(PointF(110, 120));
   EXPECT_FALSE(a1StillOverWhenATold);
-}
-
-TEST_F(MouseOverTest, MovingWithinTheLeafChangesNothing) {
-  MoveTo(PointF(25, 25));
-  log.Clear();
-  MoveTo(PointF(26, 27));
-  EXPECT_THAT(log.Texts(), IsEmpty());
-}
-
-TEST_F(MouseOverTest, MovingFromAChildToItsParentTellsTheParentWithoutAnExitOrAFlagChange) {
-  MoveTo(PointF(25, 25));
-  log.Clear();
-  MoveTo(PointF(60, 60));
-  EXPECT_EQ(manager.GetMouseOverLeafNode(), a.get());
-  EXPECT_TRUE(Over(a));
-  EXPECT_FALSE(Over(a1));
-  EXPECT_THAT(log.Texts(), ElementsAre("a1.mouse(a1)", "a1.over-(-)", "a.over+(-)"));
-  EXPECT_TRUE(a->UI_IsMouseOver(true));
-}
-
-TEST_F(MouseOverTest, MovingFromAParentIntoItsChildTellsTheParentItIsNoLongerTheLeaf) {
-  MoveTo(PointF(60, 60));
-  log.Clear();
-  MoveTo(PointF(25, 25));
-  EXPECT_THAT(log.Texts(), ElementsAre("a.over-(-)", "a1.over+(-)"));
-  EXPECT_TRUE(Over(a)) << "the parent still has the mouse over it";
 }
 
 TEST_F(MouseOverTest, NodesThatAskForItAreInvalidatedWhenTheirHoverChanges) {

@@ -62,17 +62,6 @@ TEST(NodeManagerLifetime, NodesMayBeRemovedAndDieAfterTheManagerIsGone) {
   root.reset();
 }
 
-TEST_F(NodeManager, ANewCaptureCancelsTheRunningOneAndEndRunsOnce) {
-  std::vector<std::string> log;
-  InputCaptureP first(new RecordingCapture(&log));
-  manager.BeginInputCapture(first);
-  manager.BeginInputCapture(new RecordingCapture(&log));
-  manager.EndInputCapture(false);
-  manager.EndInputCapture(false);
-  EXPECT_EQ(log, (std::vector<std::string>{"begin", "cancelled", "begin", "ended"}));
-  EXPECT_FALSE(manager.HasInputCapture());
-}
-
 TEST_F(NodeManager, UniqueTimerIDsCountDownFromMinusTwoAndNeverGiveTheTipTimersID) {
   EXPECT_EQ(UI_NodeManager::GetTooltipTimerID(), -1);
   EXPECT_EQ(manager.GetUniqueTimerID(), -2);
@@ -167,16 +156,6 @@ TEST_F(ModalStack, PoppingRestoresTheFocusSavedWhenTheWindowWasPushed) {
   EXPECT_FALSE(button->UI_HasKeyboardFocus(false));
 }
 
-TEST_F(ModalStack, PoppingWithNoSavedFocusClearsTheFocusLeaf) {
-  auto dialog = MakeView(0, 0, 50, 50, nullptr, "dialog");
-  dialog->wantsFocus = true;
-  manager.PushModalWindow(dialog.get());
-  dialog->UI_GainKeyboardFocus(kFocusChangeMouse);
-  manager.PopModalWindow(dialog.get());
-  EXPECT_EQ(manager.GetKeyboardFocusLeafNode(), nullptr);
-  EXPECT_EQ(manager.GetPreviousKeyboardFocusLeafNode(), dialog.get());
-}
-
 // ---------------------------------------------------------------------------
 
 class CachedNodes : public ManagerTest {
@@ -220,12 +199,6 @@ TEST_F(CachedNodes, RemovingASubtreeReplacesPointersIntoItsDescendants) {
   root->ChildRemove(panel.get());
   EXPECT_EQ(manager.GetMouseOverLeafNode(), root.get());
   EXPECT_EQ(manager.GetKeyboardFocusLeafNode(), root.get());
-}
-
-TEST_F(CachedNodes, TheReplacementAlsoReachesTheSiblingsSubtrees) {
-  manager.SetMouseOverLeafNode(sibling.get());
-  root->ChildRemove(panel.get());
-  EXPECT_EQ(manager.GetMouseOverLeafNode(), root.get());
 }
 
 TEST_F(CachedNodes, ASavedModalFocusInsideTheRemovedNodeIsReplaced) {
@@ -460,11 +433,6 @@ TEST(CustomSettings, AValueOfAnotherTypeAnswersTheFallbackAndReloadRestoresDefau
   EXPECT_EQ(settings.GetString("norvik.controls.UI_SliderGap", "x"), "x");
   settings.Reload();
   EXPECT_EQ(settings.GetLong("norvik.controls.UI_SliderCenterTick_Height", 0), 12);
-}
-
-TEST_F(NodeManager, TheManagerOwnsADefaultSettingsTable) {
-  ASSERT_NE(manager.GetCustomSettingsManager(), nullptr);
-  EXPECT_EQ(manager.GetCustomSettingsManager()->GetLong("norvik.controls.UI_SliderCenterTick_Height", 0), 12);
 }
 
 }  // namespace
