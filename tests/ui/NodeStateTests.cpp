@@ -127,32 +127,10 @@ TEST_F(ShowHide, AllParentsVisibleNeedsEveryAncestorShownAndIsFalseAtARoot) {
 
 using CallbackLists = ManagerTest;
 
-TEST_F(CallbackLists, EntriesFireInOrderAndANullEntryIsSkipped) {
-  auto v = MakeView(0, 0, 10, 10);
-  std::vector<int> order;
-  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] { order.push_back(1); }));
-  v->InstallSizeChangedFunction(UI_Node::VoidFunction());
-  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] { order.push_back(2); }));
-  v->UI_SetLocalRectF(tarsel::geom::RectT<float>(0, 0, 20, 20));
-  EXPECT_EQ(order, (std::vector<int>{1, 2}));
-}
-
 TEST_F(CallbackLists, AnEntryHoldingAnEmptyFunctionRaisesTheStandardError) {
   auto v = MakeView(0, 0, 10, 10);
   v->InstallDisabledChangedFunction(boost::make_shared<boost::function<void()>>());
   EXPECT_THROW(v->UI_SetDisabled(true), boost::bad_function_call);
-}
-
-TEST_F(CallbackLists, ACallbackMayInstallAnotherWithoutDisturbingThePass) {
-  auto v = MakeView(0, 0, 10, 10);
-  int calls = 0;
-  UI_Node* raw = v.get();
-  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] {
-    ++calls;
-    raw->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] { calls += 10; }));
-  }));
-  v->UI_SetLocalRectF(tarsel::geom::RectT<float>(0, 0, 20, 20));
-  EXPECT_EQ(calls, 1);
 }
 
 TEST_F(CallbackLists, TimerNotificationStopsAtTheFirstTrueAnswer) {

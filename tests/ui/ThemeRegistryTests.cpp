@@ -43,11 +43,6 @@ TEST_F(ThemeRegistry, InitializeReplacesEverythingWithTheGivenDefault) {
   EXPECT_FALSE(Theme::GetTheme(u"Other"));
 }
 
-TEST_F(ThemeRegistry, AnUnknownNameAnswersNull) {
-  Theme::Initialize(ThemeP(new Theme(379, 3)));
-  EXPECT_FALSE(Theme::GetTheme(u"NoSuchTheme"));
-}
-
 TEST_F(ThemeRegistry, RegisteringATakenNameFailsAndReleasesTheRefusedTheme) {
   Theme::Initialize(ThemeP(new Theme(379, 3)));
   bool destroyed = false;
