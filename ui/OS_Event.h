@@ -28,6 +28,7 @@ enum OS_Message : unsigned {
   kOSMsgPaint = 15,
   kOSMsgClose = 16,
   kOSMsgEraseBackground = 20,
+  kOSMsgSettingChange = 26,  // the desktop's settings changed; sent to top levels
   kOSMsgActivateApp = 28,
   kOSMsgSetCursor = 32,
   kOSMsgMouseActivate = 33,

@@ -4,6 +4,7 @@
 #include "ui/CustomSettingsManager.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_Preferences.h"
+#include "support/ui/NativeWindowTestSupport.h"
 
 namespace norvik::ui {
 namespace {
@@ -56,6 +57,15 @@ TEST(OSPreferencesTest, ByDefaultTheNativeLayerAnswers) {
   settings.Set("windows.MnemonicsAlwaysOn", true);
   settings.ReloadOSPreferences();
   EXPECT_TRUE(settings.GetBool("windows.MnemonicsAlwaysOn", false));
+}
+
+using OSPreferencesWindowTest = test::NativeWindowTest;
+
+TEST_F(OSPreferencesWindowTest, AChangedDesktopSettingReachesTheManagersSettingsThroughItsWindows) {
+  auto window = MakeTopLevel(OS_Rect(0, 0, 100, 100));
+  mSystem.SetPreference("windows.MnemonicsAlwaysOn", true);
+  mSystem.Pump();
+  EXPECT_TRUE(mManager.GetCustomSettingsManager()->GetBool("windows.MnemonicsAlwaysOn", false));
 }
 
 }  // namespace

@@ -333,38 +333,38 @@ TEST_F(X11Protocol, AWindowUncoveredByAnotherClientsWindowIsRepainted) {
 
 // ---- desktop settings and the screen ----
 
-// The settings data of a daemon that knows one integer setting.
-std::vector<std::uint8_t> IntegerSetting(const std::string& inName, std::uint32_t inValue, std::uint32_t inSerial) {
+// The settings data of a daemon that knows these integer settings.
+std::vector<std::uint8_t> IntegerSettings(const std::vector<std::pair<std::string, std::uint32_t>>& inSettings,
+                                          std::uint32_t inSerial) {
   std::vector<std::uint8_t> data = {0, 0, 0, 0};
   auto put32 = [&](std::uint32_t v) {
     for (int i = 0; i < 4; ++i) data.push_back(static_cast<std::uint8_t>(v >> (8 * i)));
   };
   put32(inSerial);
-  put32(1);
-  data.push_back(0);  // integer
-  data.push_back(0);
-  data.push_back(static_cast<std::uint8_t>(inName.size()));
-  data.push_back(static_cast<std::uint8_t>(inName.size() >> 8));
-  data.insert(data.end(), inName.begin(), inName.end());
-  while (data.size() % 4) data.push_back(0);
-  put32(inSerial);
-  put32(inValue);
+  put32(static_cast<std::uint32_t>(inSettings.size()));
+  for (const auto& [name, value] : inSettings) {
+    data.insert(data.end(), {0, 0, static_cast<std::uint8_t>(name.size()), static_cast<std::uint8_t>(name.size() >> 8)});
+    data.insert(data.end(), name.begin(), name.end());
+    while (data.size() % 4) data.push_back(0);
+    put32(inSerial);
+    put32(value);
+  }
   return data;
 }
 
-TEST_F(X11Protocol, TheDoubleClickTimeFollowsTheSettingsDaemon) {
+TEST_F(X11Protocol, TheDesktopSettingsFollowTheSettingsDaemonAndTellTheTopLevels) {
   EXPECT_EQ(mLayer->GetDoubleClickTime(), 500u) << "no daemon: the default";
   const xcb_atom_t settings = UserAtom("_XSETTINGS_SETTINGS");
   xcb_window_t daemon = xcb_generate_id(mUser);
   xcb_create_window(mUser, XCB_COPY_FROM_PARENT, daemon, mXTest->GetRoot(), -10, -10, 1, 1, 0,
                     XCB_WINDOW_CLASS_INPUT_ONLY, XCB_COPY_FROM_PARENT, 0, nullptr);
-  auto publish = [&](std::uint32_t inValue, std::uint32_t inSerial) {
-    const std::vector<std::uint8_t> data = IntegerSetting("Net/DoubleClickTime", inValue, inSerial);
+  auto publish = [&](const std::vector<std::uint8_t>& data) {
     xcb_change_property(mUser, XCB_PROP_MODE_REPLACE, daemon, settings, settings, 8,
                         static_cast<std::uint32_t>(data.size()), data.data());
     xcb_flush(mUser);
   };
-  publish(250, 1);
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 50, 50), 0x111111);
+  publish(IntegerSettings({{"Net/DoubleClickTime", 250}}, 1));
   xcb_set_selection_owner(mUser, daemon, UserAtom("_XSETTINGS_S0"), XCB_CURRENT_TIME);
   xcb_client_message_event_t manager{};
   manager.response_type = XCB_CLIENT_MESSAGE;
@@ -378,8 +378,27 @@ TEST_F(X11Protocol, TheDoubleClickTimeFollowsTheSettingsDaemon) {
   xcb_flush(mUser);
   EXPECT_TRUE(WaitFor([&] { return mLayer->GetDoubleClickTime() == 250u; })) << "a daemon that starts later is heard";
 
-  publish(700, 2);
+  mMessages.clear();
+  publish(IntegerSettings({{"Net/DoubleClickTime", 700}, {"Net/DoubleClickDistance", 6}, {"Gtk/AutoMnemonics", 0}}, 2));
   EXPECT_TRUE(WaitFor([&] { return mLayer->GetDoubleClickTime() == 700u; })) << "a changed setting is followed";
+  EXPECT_EQ(mLayer->GetDoubleClickSize(), OS_Point(12, 12));
+  bool alwaysOn = false;
+  EXPECT_TRUE(mLayer->GetPreference("windows.MnemonicsAlwaysOn", alwaysOn) && alwaysOn);
+  EXPECT_TRUE(WaitFor([&] { return Received(kOSMsgSettingChange); }));
+  EXPECT_EQ(MessagesOf(kOSMsgSettingChange).front().window, window);
+
+  std::vector<tarsel::config::ErrorReport> reports;
+  tarsel::config::ErrorManager* errors = tarsel::config::ErrorManager::Get(true);
+  auto previous = errors->SetReportHandler([&](const tarsel::config::ErrorReport& r) { reports.push_back(r); });
+  std::vector<std::uint8_t> lying = IntegerSettings({{"Net/DoubleClickTime", 300}}, 3);
+  lying[8] = 9;  // nine settings in the bytes of one
+  publish(lying);
+  EXPECT_TRUE(WaitFor([&] { return !reports.empty(); }));
+  errors->SetReportHandler(previous);
+  ASSERT_FALSE(reports.empty());
+  EXPECT_EQ(reports[0].mKeyPath, "norvik/ui/Error/XSettingsMalformed");
+  EXPECT_EQ(mLayer->GetDoubleClickTime(), 500u) << "nothing of malformed data is kept";
+  EXPECT_FALSE(mLayer->GetPreference("windows.MnemonicsAlwaysOn", alwaysOn));
 
   xcb_destroy_window(mUser, daemon);
   xcb_flush(mUser);

@@ -47,6 +47,9 @@ bool OS_Window::UI_DispatchEvent(OS_Event* inEvent) {
       UI_DefaultHandleOSEvent(inEvent);
       if (manager) manager->SetApplicationFrontmost(inEvent->GetWParam() != 0);
       return false;
+    case kOSMsgSettingChange:
+      if (manager && manager->GetCustomSettingsManager()) manager->GetCustomSettingsManager()->ReloadOSPreferences();
+      return true;
     case kOSMsgSetCursor:
       return HandleSetCursor(inEvent);
     case kOSMsgMouseActivate:

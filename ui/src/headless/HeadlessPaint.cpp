@@ -282,6 +282,11 @@ int OS_NativeLayer_Headless::GetCaretCount(OS_WindowHandle inWindow) const {
   return window ? window->caretCount : 0;
 }
 
+void OS_NativeLayer_Headless::SetPreference(const std::string& inName, bool inValue) {
+  mPreferences[inName] = inValue;
+  for (OS_WindowHandle window : mTopLevels) PostMessage(window, kOSMsgSettingChange, 0, 0);
+}
+
 bool OS_NativeLayer_Headless::GetPreference(const std::string& inName, bool& outValue) const {
   auto it = mPreferences.find(inName);
   if (it == mPreferences.end()) return false;

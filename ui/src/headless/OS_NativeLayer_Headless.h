@@ -222,7 +222,8 @@ class OS_NativeLayer_Headless : public OS_NativeLayer {
   void AdvanceClock(OS_EventTime inMilliseconds);
   int PumpUntilIdle();
   void SetMonitors(std::vector<OS_Monitor> inMonitors) { mMonitors = std::move(inMonitors); }
-  void SetPreference(const std::string& inName, bool inValue) { mPreferences[inName] = inValue; }
+  // Stores the answer and tells every top level, as a desktop does.
+  void SetPreference(const std::string& inName, bool inValue);
   void SetKeyToggled(int inVirtualKey, bool inToggled);
   OS_WindowHandle CreateForeignWindow(const OS_WindowCreateParams& inParams, bool inOtherThread);
   void SetApplication(OS_WindowHandle inWindow, int inApplication);

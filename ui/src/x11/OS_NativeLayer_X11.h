@@ -185,7 +185,7 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void SetCursor(OS_CursorHandle inCursor) override;
   OS_CursorHandle GetCursor() const override { return mCursor; }
   unsigned GetDoubleClickTime() const override { return mDoubleClickTime; }
-  OS_Point GetDoubleClickSize() const override { return OS_Point(4, 4); }
+  OS_Point GetDoubleClickSize() const override { return mDoubleClickSize; }
 
   // ---- keyboard ----
   short GetKeyState(int inVirtualKey) const override;
@@ -232,7 +232,10 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   void NoticeGrabEnd(const xcb_enter_notify_event_t* inEvent);
   // XSETTINGS (X11Settings.cpp)
   void WatchXSettings();
-  void ReadXSettings();
+  // Reads the daemon's settings, or the defaults without one; with inAnnounce,
+  // tells our top levels when what the toolkit sees of them changed.
+  void ReadXSettings(bool inAnnounce);
+  void ApplyXSettings(const std::uint8_t* inData, std::size_t inSize);
   // Answers true when inEvent concerned the settings daemon and was handled.
   bool TranslateSettingsEvent(const xcb_generic_event_t* inEvent);
   // window manager hints (X11Hints.cpp)
@@ -316,6 +319,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   std::map<int, OS_CursorHandle> mSystemCursors;
   void* mCursorContext = nullptr;
   unsigned mDoubleClickTime = 500;
+  OS_Point mDoubleClickSize{4, 4};                // the rectangle a second click may stray in
+  std::map<std::string, bool> mPreferences;      // the desktop's answers to GetPreference
   xcb_window_t mXSettingsWindow = 0;  // the settings daemon's window, 0 when none runs
   OS_EventTime mMessageTime = 0;
   std::chrono::steady_clock::time_point mStart;

@@ -131,7 +131,8 @@ void OS_NativeLayer_X11::TranslateButton(const xcb_button_press_event_t* inEvent
     keys |= ButtonBit(button);
     message = DownMessage(button);
     const X11Window* window = Find(target);
-    const bool near = std::labs(screen.x - mLastClickPoint.x) <= 2 && std::labs(screen.y - mLastClickPoint.y) <= 2;
+    const bool near = std::labs(screen.x - mLastClickPoint.x) <= mDoubleClickSize.x / 2 &&
+                      std::labs(screen.y - mLastClickPoint.y) <= mDoubleClickSize.y / 2;
     const bool isDouble = window && (window->classStyle & kOSClassStyleDoubleClicks) && !mLastWasDoubleClick &&
                           target == mLastClickWindow && button == mLastClickButton &&
                           now - mLastClickTime <= static_cast<OS_EventTime>(mDoubleClickTime) && near;

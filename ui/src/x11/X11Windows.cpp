@@ -340,6 +340,5 @@ void OS_NativeLayer_X11::ShowCaret(OS_WindowHandle inWindow, bool inShow) {
   if (X11Window* window = Find(inWindow)) window->caretCount += inShow ? 1 : -1;
 }
 
-bool OS_NativeLayer_X11::GetPreference(const std::string&, bool&) const { return false; }
 
 }  // namespace norvik::ui::x11
