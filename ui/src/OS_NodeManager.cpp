@@ -20,6 +20,8 @@ OS_NodeManager::OS_NodeManager() {
   SetResourceManager(NewModuleResourceManager());
   SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
   SetOSDrawSupplier(SharePlatformSupplier());
+  // What the desktop says at start; changes come later as setting-change messages.
+  GetCustomSettingsManager()->ReloadOSPreferences();
 }
 
 tarsel::geom::PointT<long> OS_NodeManager::GetGlobalMousePosition() const {
