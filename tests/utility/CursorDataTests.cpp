@@ -1,12 +1,12 @@
 // Cursor data documents: the names of a cursor's resources, the hot spot
 // read from its document, and the refusal of documents that are not cursor
 // data of this version.
-#include <functional>
 #include <string>
 
 #include <gtest/gtest.h>
 
 #include "support/utility/MemoryResourceManager.h"
+#include "support/tarsel/ErrorText.h"
 #include "tarsel/ThrowError.h"
 #include "utility/CursorUtils.h"
 #include "utility/OS_ResourceManager.h"
@@ -14,14 +14,7 @@
 namespace norvik::utility {
 namespace {
 
-std::string ErrorOf(std::function<void()> const& inCall) {
-  try {
-    inCall();
-  } catch (tarsel::config::Exception const& e) {
-    return e.what();
-  }
-  return "no error";
-}
+using norvik::test::ErrorOf;
 
 std::pair<short, short> HotSpot(short inX, short inY) { return {inX, inY}; }
 
@@ -68,46 +61,29 @@ TEST(CursorNames, TheNumberReplacesTheMarkInBothNames) {
   EXPECT_EQ(data, u"CursorDataID-1234");
 }
 
-TEST_F(CursorData, AVersionOneDocumentGivesItsHotSpot) {
+TEST_F(CursorData, ADocumentGivesItsHotSpotHeldToTheShortRangeOrTheTopLeftCornerWithoutOne) {
   EXPECT_EQ(Load(Document(VersionPair("1.0") + HotSpotPair(7, 12))), HotSpot(7, 12));
-}
-
-TEST_F(CursorData, AMissingDocumentGivesTheTopLeftCorner) {
-  EXPECT_EQ(LoadCursorHotSpot(u"CursorDataID-999", mResources), HotSpot(0, 0));
-}
-
-TEST_F(CursorData, ADocumentWithoutAHotSpotGivesTheTopLeftCorner) {
+  EXPECT_EQ(Load(Document(VersionPair("1.0") + HotSpotPair(70000, -70000))), HotSpot(32767, -32768));
   EXPECT_EQ(Load(Document(VersionPair("1.0"))), HotSpot(0, 0));
+  EXPECT_EQ(LoadCursorHotSpot(u"CursorDataID-999", mResources), HotSpot(0, 0)) << "no document at all";
 }
 
-TEST_F(CursorData, ADocumentWithoutTheVersionKeyIsNotCursorData) {
-  EXPECT_EQ(LoadError(Document(HotSpotPair(1, 1))), "Not a valid cursor data definition.");
-  EXPECT_EQ(LoadError(Document("")), "Not a valid cursor data definition.");
-}
-
-TEST_F(CursorData, AVersionThatIsNotTextIsNotCursorData) {
-  EXPECT_EQ(LoadError(Document("<prop.pair><key>NRK_CursorData</key>" + Int32(1) + "</prop.pair>")),
-            "Not a valid cursor data definition.");
-}
-
-TEST_F(CursorData, AnotherVersionIsRefused) {
-  EXPECT_EQ(LoadError(Document(VersionPair("2.0") + HotSpotPair(1, 1))),
-            "Unable to load cursor data file. Incompatible version.");
-  EXPECT_EQ(LoadError(Document(VersionPair("1.00") + HotSpotPair(1, 1))),
-            "Unable to load cursor data file. Incompatible version.");
-  EXPECT_EQ(LoadError(Document(VersionPair("") + HotSpotPair(1, 1))),
-            "Unable to load cursor data file. Incompatible version.");
-}
-
-TEST_F(CursorData, TextThatIsNotADocumentRaisesTheReadersError) {
-  EXPECT_THROW(Load("<prop.map version='1'><prop.list>"), tarsel::config::Exception);
-  EXPECT_THROW(Load(""), tarsel::config::Exception);
-  EXPECT_THROW(Load(std::string("\0\xff\xfe<", 4)), tarsel::config::Exception);
-}
-
-TEST_F(CursorData, CoordinatesBeyondTheShortRangeAreHeldAtItsEnds) {
-  EXPECT_EQ(Load(Document(VersionPair("1.0") + HotSpotPair(70000, -70000))),
-            HotSpot(32767, -32768));
+TEST_F(CursorData, DocumentsThatAreNotCursorDataOfThisVersionAreRefusedWithTheirTexts) {
+  const std::string invalid = "Not a valid cursor data definition.";
+  const std::string incompatible = "Unable to load cursor data file. Incompatible version.";
+  const std::pair<std::string, std::string> cases[] = {
+      {Document(HotSpotPair(1, 1)), invalid},
+      {Document(""), invalid},
+      {Document("<prop.pair><key>NRK_CursorData</key>" + Int32(1) + "</prop.pair>"), invalid},
+      {Document(VersionPair("2.0") + HotSpotPair(1, 1)), incompatible},
+      {Document(VersionPair("1.00") + HotSpotPair(1, 1)), incompatible},
+      {Document(VersionPair("") + HotSpotPair(1, 1)), incompatible},
+  };
+  for (const auto& [document, error] : cases) EXPECT_EQ(LoadError(document), error) << document;
+  // Text that is no document at all raises the reader's own error.
+  for (const std::string& text : {std::string("<prop.map version='1'><prop.list>"), std::string(),
+                                  std::string("\0\xff\xfe<", 4)})
+    EXPECT_THROW(Load(text), tarsel::config::Exception);
 }
 
 TEST(LibraryCursorData, TheLibrarysOwnDocumentsPutTheHotSpotAtTheTopLeft) {

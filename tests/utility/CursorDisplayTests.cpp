@@ -72,22 +72,6 @@ TEST_F(CursorDisplay, ADrawnCursorCarriesThePixelsAndHotSpotOfItsPicture) {
   EXPECT_EQ(picture.pixels[static_cast<std::size_t>(picture.size.x) - 1] >> 24, 0u);
 }
 
-TEST_F(CursorDisplay, TheTwoDrawnCursorsDifferAndAreMadeOnce) {
-  mResources.DisplayCursor(26);
-  const ui::OS_CursorHandle add = InForce();
-  mResources.DisplayCursor(27);
-  const ui::OS_CursorHandle link = InForce();
-  EXPECT_NE(add, link);
-  CursorPicture a, b;
-  ASSERT_TRUE(PictureOf(add, a));
-  ASSERT_TRUE(PictureOf(link, b));
-  EXPECT_NE(a.pixels, b.pixels);
-  mResources.DisplayCursor(26);
-  EXPECT_EQ(InForce(), add);
-  ASSERT_NE(mResources.FindCursorInfo(26), nullptr);
-  EXPECT_TRUE(mResources.FindCursorInfo(26)->loaded);
-}
-
 TEST_F(CursorDisplay, ANumberWithoutAPictureFallsBackToTheArrow) {
   for (int id : {7, 8, 9, 28, 1000}) {
     SCOPED_TRACE(id);
@@ -119,16 +103,6 @@ TEST_F(CursorDisplay, ARegisteredPictureIsMadeOnlyWhenFirstShown) {
   EXPECT_EQ(shown.hotSpot.y, 1);
 }
 
-TEST_F(CursorDisplay, ARegistrationByResourceTakesThePictureByName) {
-  mResources.MakeCursorFromPNG(41, u"rv4_pickwhip_n", 5, 6, ui::LoadByPolicy::kByResource);
-  mResources.DisplayCursor(41);
-  CursorPicture shown;
-  ASSERT_TRUE(PictureOf(InForce(), shown));
-  EXPECT_EQ(shown.pixels, Decoded(u"RV4_PickWhip_N").pixels);
-  EXPECT_EQ(shown.hotSpot.x, 5);
-  EXPECT_EQ(shown.hotSpot.y, 6);
-}
-
 TEST_F(CursorDisplay, AMissingRegisteredPictureRaisesAndLeavesTheCursorInForce) {
   mResources.DisplayCursor(2);
   const ui::OS_CursorHandle before = InForce();
@@ -143,19 +117,6 @@ TEST_F(CursorDisplay, AMissingRegisteredPictureRaisesAndLeavesTheCursorInForce) 
   mResources.MakeCursorFromPNG(43, u"/no/such/dir/cursor.png", 0, 0, ui::LoadByPolicy::kByPath);
   EXPECT_THROW(mResources.DisplayCursor(43), tarsel::config::Exception);
   EXPECT_EQ(InForce(), before);
-}
-
-TEST_F(CursorDisplay, DisposingReleasesTheNativeCursorAndTheNextDisplayMakesItAgain) {
-  mResources.DisplayCursor(27);
-  const ui::OS_CursorHandle first = InForce();
-  mResources.DisplayCursor(0);
-  mResources.DisposeCursor(27);
-  CursorPicture gone;
-  EXPECT_FALSE(PictureOf(first, gone));
-  EXPECT_FALSE(mResources.FindCursorInfo(27)->loaded);
-  mResources.DisplayCursor(27);
-  CursorPicture again;
-  EXPECT_TRUE(PictureOf(InForce(), again));
 }
 
 TEST_F(CursorDisplay, ACursorFromAnImageKeepsItsHotSpotInsideThePicture) {

@@ -2,7 +2,6 @@
 // supplier, read through a resource manager only on a miss; and the node
 // manager's lookup through it.
 #include <fstream>
-#include <functional>
 #include <iterator>
 #include <memory>
 #include <string>
@@ -14,6 +13,7 @@
 #include "support/drawbot/RecordingSupplier.h"
 #include "support/utility/MemoryResourceManager.h"
 #include "tarsel/Contract.h"
+#include "support/tarsel/ErrorText.h"
 #include "tarsel/ThrowError.h"
 #include "ui/DrawbotImageResourceCache.h"
 #include "ui/OS_NodeManager.h"
@@ -26,14 +26,7 @@ namespace {
 using drawbot::kImageFileTypePNG;
 using ui::DrawbotImageResourceCache;
 
-std::string ErrorOf(std::function<void()> const& inCall) {
-  try {
-    inCall();
-  } catch (tarsel::config::Exception const& e) {
-    return e.what();
-  }
-  return "no error";
-}
+using norvik::test::ErrorOf;
 
 class ImageCache : public ::testing::Test {
  protected:
@@ -78,16 +71,6 @@ TEST_F(ImageCache, TwoSuppliersOfTheSameKindShareTheEntry) {
   EXPECT_EQ(mCache.GetSize(), 1u);
 }
 
-TEST_F(ImageCache, NamesThatDifferOnlyInCaseAreSeparateEntriesOfTheSamePicture) {
-  // The resource table ignores case; the cache key does not, so the cost of
-  // mixed spellings is a second decode, never a wrong picture.
-  auto mixed = mCache.GetImage(&mLibrary, mPlatform, "RV4_Gripper", kImageFileTypePNG);
-  auto upper = mCache.GetImage(&mLibrary, mPlatform, "RV4_GRIPPER", kImageFileTypePNG);
-  EXPECT_NE(mixed.get(), upper.get());
-  EXPECT_EQ(mixed->GetWidth(), upper->GetWidth());
-  EXPECT_EQ(mixed->GetHeight(), upper->GetHeight());
-}
-
 TEST_F(ImageCache, FindDoesNotLoadAndRemoveForgets) {
   EXPECT_FALSE(mCache.FindImage(mPlatform, "SP_Add_Sm_N", kImageFileTypePNG));
   auto image = mCache.GetImage(&mLibrary, mPlatform, "SP_Add_Sm_N", kImageFileTypePNG);
@@ -110,12 +93,6 @@ TEST_F(ImageCache, AMissingNameRaisesTheResourceErrorAndCachesNothing) {
   EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "RV4_NoSuchIcon_N", kImageFileTypePNG); }),
             "Unable to access resource 'RV4_NoSuchIcon_N' (type png)");
   EXPECT_EQ(mCache.GetSize(), 0u);
-}
-
-TEST_F(ImageCache, AnImageWithoutItsLightPanelVariantFailsAtTheResource) {
-  EXPECT_NO_THROW(mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap", kImageFileTypePNG));
-  EXPECT_EQ(ErrorOf([&] { mCache.GetImage(&mLibrary, mPlatform, "RV4_FBColorSwap_D", kImageFileTypePNG); }),
-            "Unable to access resource 'RV4_FBColorSwap_D' (type png)");
 }
 
 TEST_F(ImageCache, FileTypesZeroAndOneAskForJpgAndPngAndJpegResourcesDecode) {
@@ -172,13 +149,6 @@ TEST(NodeManagerImages, ThePlatformManagerReadsTheLibrarysOwnPicturesAsBuilt) {
   ASSERT_NE(image, nullptr);
   EXPECT_EQ(image->GetWidth(), 16u);
   EXPECT_EQ(manager.GetDrawbotImageResourceCache()->GetSize(), 1u);
-}
-
-TEST(NodeManagerImages, WithoutAResourceManagerGetImageRaisesTheAccessError) {
-  ui::UI_NodeManager manager;
-  manager.SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
-  EXPECT_EQ(ErrorOf([&] { manager.GetImage(drawbot::NewOSSupplier(), "Gripper", kImageFileTypePNG); }),
-            "Unable to access resource.");
 }
 
 TEST(NodeManagerImages, WithoutACacheGetImageIsAContractViolation) {

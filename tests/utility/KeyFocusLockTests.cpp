@@ -50,26 +50,6 @@ TEST_F(KeyFocusLockTest, WithoutFocusAtTheStartTheLockDoesNothing) {
   EXPECT_EQ(FocusLeafID(), "b");
 }
 
-TEST_F(KeyFocusLockTest, ANodeMovedWithinItsWindowStillTakesFocusBack) {
-  ui::test::FocusableViewP panel = AddView(*mWindow, "panel", &mLog);
-  mA->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  {
-    KeyFocusLock lock;
-    ui::UI_NodeP keep = mWindow->ChildRemove(mA.get());
-    panel->ChildPushBack(keep);
-  }
-  EXPECT_EQ(FocusLeafID(), "a");
-  EXPECT_TRUE(panel->UI_HasKeyboardFocus(false));
-}
-
-TEST_F(KeyFocusLockTest, FocusThatNeverMovedIsLeftAloneAndNobodyIsTold) {
-  mA->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  mLog.clear();
-  { KeyFocusLock lock; }
-  EXPECT_EQ(FocusLeafID(), "a");
-  EXPECT_TRUE(mLog.empty());
-}
-
 TEST_F(KeyFocusLockTest, ANodeMovedToAnotherWindowStillTakesFocusBack) {
   boost::intrusive_ptr<ui::test::TestWindowNode> other(new ui::test::TestWindowNode);
   mA->UI_GainKeyboardFocus(ui::kFocusChangeMouse);

@@ -15,28 +15,23 @@ using Point = MonitorInfo::Point;
 
 MonitorInfo TwoSideBySide() { return MonitorInfo({Rect(0, 0, 1000, 800), Rect(1000, 0, 1000, 800)}); }
 
-TEST(MonitorInfoTest, ARectangleEquallyOverTwoMonitorsBelongsToTheFirst) {
-  const MonitorInfo monitors = TwoSideBySide();
-  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(900, 100, 200, 100)), Rect(0, 0, 1000, 800));
-  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(901, 100, 200, 100)), Rect(1000, 0, 1000, 800));
-}
-
-TEST(MonitorInfoTest, WithOneMonitorARectangleFarOutsideStillGetsIt) {
-  const MonitorInfo monitors({Rect(0, 0, 1000, 800)});
-  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(50000, -90000, 10, 10)), Rect(0, 0, 1000, 800));
-}
-
-TEST(MonitorInfoTest, ARectangleOnNoMonitorGoesToTheNearest) {
-  const MonitorInfo monitors = TwoSideBySide();
-  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(2500, 100, 50, 50)), Rect(1000, 0, 1000, 800));
-  EXPECT_EQ(monitors.GetMonitorRectFromRect(Rect(-900, 100, 50, 50)), Rect(0, 0, 1000, 800));
-}
-
-TEST(MonitorInfoTest, APointBelongsToTheMonitorHoldingItOrTheNearest) {
-  const MonitorInfo monitors = TwoSideBySide();
-  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(1000, 10)), Rect(1000, 0, 1000, 800));
-  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(999, 10)), Rect(0, 0, 1000, 800));
-  EXPECT_EQ(monitors.GetMonitorRectFromPoint(Point(500, 5000)), Rect(0, 0, 1000, 800));
+TEST(MonitorInfoTest, ARectangleOrPointBelongsToTheMonitorHoldingMostOfItOrTheNearest) {
+  const MonitorInfo two = TwoSideBySide();
+  const Rect left(0, 0, 1000, 800), right(1000, 0, 1000, 800);
+  const struct {
+    Rect rect;
+    Rect monitor;
+  } cases[] = {
+      {Rect(900, 100, 200, 100), left},  // equally over both: the first
+      {Rect(901, 100, 200, 100), right},
+      {Rect(2500, 100, 50, 50), right},  // on none: the nearest
+      {Rect(-900, 100, 50, 50), left},
+  };
+  for (const auto& c : cases) EXPECT_EQ(two.GetMonitorRectFromRect(c.rect), c.monitor) << c.rect.left;
+  EXPECT_EQ(MonitorInfo({left}).GetMonitorRectFromRect(Rect(50000, -90000, 10, 10)), left);
+  EXPECT_EQ(two.GetMonitorRectFromPoint(Point(1000, 10)), right);
+  EXPECT_EQ(two.GetMonitorRectFromPoint(Point(999, 10)), left);
+  EXPECT_EQ(two.GetMonitorRectFromPoint(Point(500, 5000)), left);
 }
 
 TEST(MonitorInfoTest, TheFurthestCornerCoversEveryMonitor) {

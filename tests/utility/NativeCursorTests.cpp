@@ -106,59 +106,6 @@ TEST_F(NativeCursors, EveryHotSpotLiesInsideThePictureOnOrBesideADrawnPixel) {
   }
 }
 
-TEST_F(NativeCursors, ToolsPointWithTheirTipsAndTheMoveArrowWithItsPoint) {
-  // The tip of the eyedropper and the pencil is their drawn pixel furthest
-  // down and to the left.
-  for (int id : {kCursorEyedropper, kCursorPencil}) {
-    SCOPED_TRACE(id);
-    const Shown shown = Display(id);
-    ASSERT_TRUE(shown.Opaque(shown.hotSpot.x, shown.hotSpot.y));
-    const long tip = shown.hotSpot.y - shown.hotSpot.x;
-    for (long y = 0; y < shown.size.y; ++y)
-      for (long x = 0; x < shown.size.x; ++x) {
-        if (shown.Opaque(x, y)) {
-          EXPECT_LE(y - x, tip + 2) << "drawn beyond the tip at " << x << ", " << y;
-        }
-      }
-  }
-  const Shown move = Display(kCursorMove);
-  EXPECT_EQ(move.hotSpot.x, 0);
-  EXPECT_EQ(move.hotSpot.y, 0);
-  EXPECT_EQ(move.At(0, 0), 0xFF000000u) << "the arrow's point is black";
-  const Shown text = Display(kCursorTextInsert);
-  EXPECT_EQ(text.At(text.hotSpot.x, text.hotSpot.y), 0xFF000000u) << "the I-beam's stem is under the hot spot";
-}
-
-TEST_F(NativeCursors, ThePicturesAreBlackWithAWhiteOutline) {
-  for (int id : GetNativeCursorNumbers()) {
-    SCOPED_TRACE(id);
-    const Shown shown = Display(id);
-    int black = 0, white = 0, coloured = 0;
-    for (std::uint32_t p : shown.pixels) {
-      const std::uint32_t a = p >> 24, r = (p >> 16) & 0xFF, g = (p >> 8) & 0xFF, b = p & 0xFF;
-      if (a == 0) continue;
-      if (r != g || g != b) ++coloured;
-      // Premultiplied: white has its channels equal to its alpha. Edges
-      // along diagonals are blended, so mostly covered pixels count.
-      if (a >= 0x80 && r <= 8) ++black;
-      if (a >= 0x80 && r + 8 >= a) ++white;
-    }
-    EXPECT_EQ(coloured, 0);
-    EXPECT_GT(black, 10);
-    EXPECT_GT(white, 10);
-    // The outline surrounds the picture: no black pixel touches the clear
-    // background, except at the edge of the image.
-    for (long y = 1; y + 1 < shown.size.y; ++y)
-      for (long x = 1; x + 1 < shown.size.x; ++x) {
-        if (shown.At(x, y) == 0xFF000000u) {
-          EXPECT_TRUE(shown.Opaque(x - 1, y) && shown.Opaque(x + 1, y) && shown.Opaque(x, y - 1) &&
-                      shown.Opaque(x, y + 1))
-              << "black pixel at " << x << ", " << y << " without an outline";
-        }
-      }
-  }
-}
-
 TEST_F(NativeCursors, ANumberedCursorIsMadeOnceAndKeptUntilDisposed) {
   const Shown first = Display(kCursorClosedHand);
   Display(kCursorZoomIn);

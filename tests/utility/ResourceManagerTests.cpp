@@ -1,7 +1,7 @@
 // Resources carried in the library: lookup by name and type without regard
 // to case, the error texts for what is missing, and the artwork set itself.
 #include <cstdint>
-#include <functional>
+#include <map>
 #include <set>
 #include <string>
 
@@ -9,6 +9,7 @@
 
 #include "drawbot/DrawbotWrappers.h"
 #include "drawbot/SupplierInterface.h"
+#include "support/tarsel/ErrorText.h"
 #include "tarsel/ThrowError.h"
 #include "utility/OS_ResourceManager.h"
 
@@ -17,14 +18,7 @@ namespace {
 
 using tarsel::utility::AsciiToUTF16;
 
-std::string ErrorOf(std::function<void()> const& inCall) {
-  try {
-    inCall();
-  } catch (tarsel::config::Exception const& e) {
-    return e.what();
-  }
-  return "no error";
-}
+using norvik::test::ErrorOf;
 
 // The names a control may ask for, as the library's table holds them.
 const char* const kArtwork[] = {
@@ -82,48 +76,32 @@ TEST(ModuleResources, AMissingResourceRaisesTheTextWithItsNameAndType) {
   EXPECT_EQ(std::string(bytes.begin(), bytes.end()), "kept");
 }
 
-TEST(ModuleResources, ACopyReadsTheSameModule) {
-  OS_ResourceManager original;
-  OS_ResourceManager copy(original);
-  EXPECT_EQ(copy.GetModule(), original.GetModule());
-  EXPECT_TRUE(copy.HasBinary(u"SP_Add_Sm_N", u"png"));
-}
-
-TEST(ToolkitArtwork, EveryNamedPictureIsCarriedAndDecodes) {
-  OS_ResourceManager resources;
-  drawbot::SupplierInterface* supplier = drawbot::NewOSSupplier();
-  for (const char* name : kArtwork) {
-    SCOPED_TRACE(name);
-    std::vector<char> bytes;
-    ASSERT_NO_THROW(resources.GetBinary(AsciiToUTF16(name), u"png", &bytes));
-    drawbot::FileImageP image(supplier, drawbot::kImageFileTypePNG, bytes.data(),
-                              static_cast<unsigned long>(bytes.size()));
-    ASSERT_FALSE(image.IsNull());
-    EXPECT_GE(image->GetWidth(), 5u);
-    EXPECT_LE(image->GetWidth(), 32u);
-    EXPECT_GE(image->GetHeight(), 5u);
-    EXPECT_LE(image->GetHeight(), 32u);
-  }
-}
-
-TEST(ToolkitArtwork, EveryThemablePictureHasALightPanelVariantOfTheSameSize) {
+// Each named picture decodes at an icon's size, and each themable one has a
+// light panel variant ("_D") of the same size that is another picture.
+TEST(ToolkitArtwork, EveryNamedPictureIsCarriedAndDecodesAndThemableOnesHaveALightPanelVariant) {
   OS_ResourceManager resources;
   drawbot::SupplierInterface* supplier = drawbot::NewOSSupplier();
   const std::set<std::string> names(std::begin(kArtwork), std::end(kArtwork));
-  int pairs = 0;
+  std::map<std::string, std::pair<std::vector<char>, drawbot::FileImageP>> decoded;
   for (const std::string& name : names) {
+    SCOPED_TRACE(name);
+    auto& [bytes, image] = decoded[name];
+    ASSERT_NO_THROW(resources.GetBinary(AsciiToUTF16(name), u"png", &bytes));
+    image = drawbot::FileImageP(supplier, drawbot::kImageFileTypePNG, bytes.data(),
+                                static_cast<unsigned long>(bytes.size()));
+    ASSERT_FALSE(image.IsNull());
+    EXPECT_TRUE(image->GetWidth() >= 5u && image->GetWidth() <= 32u) << image->GetWidth();
+    EXPECT_TRUE(image->GetHeight() >= 5u && image->GetHeight() <= 32u) << image->GetHeight();
+  }
+  int pairs = 0;
+  for (const auto& [name, dark] : decoded) {
     if (name.size() < 3 || name.compare(name.size() - 2, 2, "_D") != 0 || name == "CHEVRON_D") continue;
-    const std::string base = name.substr(0, name.size() - 2);
-    SCOPED_TRACE(base);
-    ASSERT_TRUE(names.count(base));
-    std::vector<char> dark, light;
-    resources.GetBinary(AsciiToUTF16(base), u"png", &light);
-    resources.GetBinary(AsciiToUTF16(name), u"png", &dark);
-    EXPECT_NE(dark, light);
-    drawbot::FileImageP a(supplier, drawbot::kImageFileTypePNG, light.data(), static_cast<unsigned long>(light.size()));
-    drawbot::FileImageP b(supplier, drawbot::kImageFileTypePNG, dark.data(), static_cast<unsigned long>(dark.size()));
-    EXPECT_EQ(a->GetWidth(), b->GetWidth());
-    EXPECT_EQ(a->GetHeight(), b->GetHeight());
+    SCOPED_TRACE(name);
+    ASSERT_TRUE(decoded.count(name.substr(0, name.size() - 2)));
+    const auto& light = decoded.at(name.substr(0, name.size() - 2));
+    EXPECT_NE(dark.first, light.first);
+    EXPECT_EQ(dark.second->GetWidth(), light.second->GetWidth());
+    EXPECT_EQ(dark.second->GetHeight(), light.second->GetHeight());
     ++pairs;
   }
   EXPECT_EQ(pairs, 34);
