@@ -38,13 +38,7 @@ TEST(ClipBounds, MinimumClipBoundsShrinksToThePartThatTouchesTheClip) {
   surface->SetClipRects({RectT<long>(100, 300, 50, 20), RectT<long>(400, 120, 10, 10)});
   RectT<long> found = surface->GetMinimumClipBounds(RectT<long>(0, 0, 1000, 1000));
   EXPECT_EQ(found, RectT<long>::FromEdges(100, 120, 410, 320));
-}
-
-TEST(ClipBounds, MinimumClipBoundsOfARectangleOutsideTheClipIsEmpty) {
-  RecordingSupplier supplier;
-  boost::intrusive_ptr<RecordingSurface> surface(new RecordingSurface(&supplier, 100, 100));
-  surface->SetClipRects({RectT<long>(10, 10, 5, 5)});
-  EXPECT_TRUE(surface->GetMinimumClipBounds(RectT<long>(50, 50, 20, 20)).IsEmpty());
+  EXPECT_TRUE(surface->GetMinimumClipBounds(RectT<long>(500, 500, 20, 20)).IsEmpty()) << "outside the clip";
 }
 
 TEST(ClipBounds, BisectionProbesLogarithmicallyManyRectangles) {

@@ -15,35 +15,30 @@ using tarsel::geom::RectT;
 
 const ColorRGBA kBlack(0, 0, 0, 1);
 
-TEST(HalfPixelRules, AWholeNumberRectangleWithAntiAliasingOffFillsExactlyItsPixels) {
-  PixelCanvas canvas(12, 4);
-  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2, 1, 5, 2));
-  auto image = canvas.Snapshot();
-  EXPECT_EQ(RowCoverage(image, 0), "............");
-  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
-  EXPECT_EQ(RowCoverage(image, 2), "..#####.....");
-  EXPECT_EQ(RowCoverage(image, 3), "............");
-  EXPECT_EQ(image.At(2, 1), 0xff000000u);
-}
-
-TEST(HalfPixelRules, AFractionalRectangleIsWidenedToWholePixelsOutward) {
-  PixelCanvas canvas(12, 4);
-  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2.5f, 1.25f, 4.0f, 1.5f));
-  auto image = canvas.Snapshot();
-  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
-  EXPECT_EQ(RowCoverage(image, 2), "..#####.....");
-  // Painted rectangles stay crisp: the edges are fully covered, not blended.
-  EXPECT_EQ(image.Alpha(2, 1), 255);
-  EXPECT_EQ(image.Alpha(6, 2), 255);
-}
-
-TEST(HalfPixelRules, AnAntiAliasedWholeNumberRectangleStaysCrisp) {
-  PixelCanvas canvas(12, 4);
-  canvas.GetSurface()->SetAntiAliasPolicy(kAntiAlias);
-  canvas.GetSurface()->PaintRect(kBlack, RectT<float>(2, 1, 5, 2));
-  auto image = canvas.Snapshot();
-  EXPECT_EQ(RowCoverage(image, 1), "..#####.....");
-  EXPECT_EQ(image.Alpha(6, 1), 255);
+// Painted rectangles stay crisp, anti-aliased or not: a fractional one is
+// widened outward to whole pixels, and its edges are fully covered.
+TEST(HalfPixelRules, APaintedRectangleFillsWholePixelsWithFullCoverage) {
+  const struct {
+    const char* name;
+    RectT<float> rect;
+    AntiAliasPolicy policy;
+  } cases[] = {
+      {"whole", RectT<float>(2, 1, 5, 2), kAntiAliasNone},
+      {"fractional", RectT<float>(2.5f, 1.25f, 4.0f, 1.5f), kAntiAliasNone},
+      {"whole, anti-aliased", RectT<float>(2, 1, 5, 2), kAntiAlias},
+  };
+  for (const auto& c : cases) {
+    PixelCanvas canvas(12, 4);
+    canvas.GetSurface()->SetAntiAliasPolicy(c.policy);
+    canvas.GetSurface()->PaintRect(kBlack, c.rect);
+    auto image = canvas.Snapshot();
+    EXPECT_EQ(RowCoverage(image, 0), "............") << c.name;
+    EXPECT_EQ(RowCoverage(image, 1), "..#####.....") << c.name;
+    EXPECT_EQ(RowCoverage(image, 2), "..#####.....") << c.name;
+    EXPECT_EQ(RowCoverage(image, 3), "............") << c.name;
+    EXPECT_EQ(image.At(2, 1), 0xff000000u) << c.name;
+    EXPECT_EQ(image.At(6, 2), 0xff000000u) << c.name;
+  }
 }
 
 TEST(HalfPixelRules, AOnePixelLineOnWholePixelsLightsExactlyOneRowWithAntiAliasingOff) {

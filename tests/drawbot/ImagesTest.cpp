@@ -36,7 +36,7 @@ PixelImage Checker() {
 
 std::string TempPath(char const* inName) { return std::string(NORVIK_TEST_OUTPUT_DIR) + "/" + inName; }
 
-TEST(PngRoundTrip, ADecodedFileDrawsTheSamePixelsThatWereSaved) {
+TEST(PngRoundTrip, ADecodedFileOrItsBytesInMemoryDrawTheSamePixelsThatWereSaved) {
   std::string path = TempPath("roundtrip.png");
   std::filesystem::create_directories(NORVIK_TEST_OUTPUT_DIR);
   ASSERT_TRUE(testing::SavePNG(Checker(), path));
@@ -47,21 +47,13 @@ TEST(PngRoundTrip, ADecodedFileDrawsTheSamePixelsThatWereSaved) {
   EXPECT_EQ(image->GetHeight(), 3u);
   canvas.GetSurface()->DrawImage(*image, PointT<float>(0, 0), 1);
   EXPECT_EQ(canvas.Snapshot().pixels, Checker().pixels);
-}
 
-TEST(PngRoundTrip, BytesInMemoryDecodeLikeAFile) {
-  std::string path = TempPath("memory.png");
-  std::filesystem::create_directories(NORVIK_TEST_OUTPUT_DIR);
-  ASSERT_TRUE(testing::SavePNG(Checker(), path));
   std::ifstream file(path, std::ios::binary);
   std::string bytes((std::istreambuf_iterator<char>(file)), std::istreambuf_iterator<char>());
-  PixelCanvas canvas(6, 5);
-  FileImageP image(canvas.GetSupplier(), kImageFileTypePNG, bytes.data(), static_cast<unsigned long>(bytes.size()));
-  canvas.GetSurface()->DrawImage(*image, PointT<float>(2, 2), 1);
-  auto shot = canvas.Snapshot();
-  EXPECT_EQ(shot.At(2, 2), 0xffff0000u);
-  EXPECT_EQ(shot.At(3, 2), 0x80008000u);
-  EXPECT_EQ(shot.At(1, 1), 0u);
+  PixelCanvas memory(4, 3);
+  FileImageP fromBytes(memory.GetSupplier(), kImageFileTypePNG, bytes.data(), static_cast<unsigned long>(bytes.size()));
+  memory.GetSurface()->DrawImage(*fromBytes, PointT<float>(0, 0), 1);
+  EXPECT_EQ(memory.Snapshot().pixels, Checker().pixels);
 }
 
 TEST(PngRoundTrip, UnreadableImagesRaiseTheReadError) {

@@ -20,20 +20,15 @@ RecordingLinearShader const& AsRecorded(LinearShaderP const& inShader) {
   return dynamic_cast<RecordingLinearShader const&>(*inShader);
 }
 
-TEST(ShaderStops, InnerStopsGetEndStopsRepeatingTheirNeighbours) {
+TEST(ShaderStops, InnerStopsGetEndStopsRepeatingTheirNeighboursAndStopsAtTheEndsAreNotDoubled) {
   RecordingSupplier supplier;
-  LinearShaderP shader(&supplier, PointT<float>(0, 0), PointT<float>(10, 0),
-                       std::vector<std::pair<float, ColorRGBA>>{{0.2f, kRed}, {0.8f, kBlue}});
-  auto const& recorded = AsRecorded(shader);
-  EXPECT_EQ(recorded.positions, (std::vector<float>{0, 0.2f, 0.8f, 1}));
-  EXPECT_EQ(recorded.colors, (std::vector<ColorRGBA>{kRed, kRed, kBlue, kBlue}));
-}
-
-TEST(ShaderStops, StopsAlreadyAtTheEndsAreNotDoubled) {
-  RecordingSupplier supplier;
-  LinearShaderP shader(&supplier, PointT<float>(0, 0), PointT<float>(10, 0),
-                       std::vector<std::pair<float, ColorRGBA>>{{0, kRed}, {0.5f, kGreen}, {1, kBlue}});
-  EXPECT_EQ(AsRecorded(shader).positions, (std::vector<float>{0, 0.5f, 1}));
+  LinearShaderP inner(&supplier, PointT<float>(0, 0), PointT<float>(10, 0),
+                      std::vector<std::pair<float, ColorRGBA>>{{0.2f, kRed}, {0.8f, kBlue}});
+  EXPECT_EQ(AsRecorded(inner).positions, (std::vector<float>{0, 0.2f, 0.8f, 1}));
+  EXPECT_EQ(AsRecorded(inner).colors, (std::vector<ColorRGBA>{kRed, kRed, kBlue, kBlue}));
+  LinearShaderP ends(&supplier, PointT<float>(0, 0), PointT<float>(10, 0),
+                     std::vector<std::pair<float, ColorRGBA>>{{0, kRed}, {0.5f, kGreen}, {1, kBlue}});
+  EXPECT_EQ(AsRecorded(ends).positions, (std::vector<float>{0, 0.5f, 1}));
 }
 
 TEST(ShaderPixels, ALinearShaderRunsFromItsStartColourToItsEndColour) {
@@ -82,20 +77,6 @@ TEST(ShaderPixels, ShadingOrStrokingADegeneratePathRaisesNothing) {
   EXPECT_NO_THROW(canvas.GetSurface()->StrokePath(*none, *point));
   auto shot = canvas.Snapshot();
   for (uint32_t p : shot.pixels) ASSERT_EQ(p, 0u);
-}
-
-TEST(PenSettings, DashesJoinsAndCapsAreKept) {
-  PenP pen(NewOSSupplier(), kRed, 2);
-  float dashes[3] = {1, 2, 3};
-  pen->SetDashArray(dashes, 3);
-  EXPECT_EQ(pen->GetDashCount(), 3);
-  float out[3] = {};
-  pen->GetDashArray(3, out);
-  EXPECT_EQ(out[2], 3);
-  pen->SetLineJoin(kLineJoinRound);
-  pen->SetLineCap(kLineCapSquare);
-  EXPECT_EQ(pen->GetLineJoin(), kLineJoinRound);
-  EXPECT_EQ(pen->GetLineCap(), kLineCapSquare);
 }
 
 TEST(PenSettings, ADashedLineLeavesGaps) {

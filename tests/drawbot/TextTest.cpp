@@ -25,23 +25,14 @@ class Truncation : public ::testing::Test {
   UTF16String text = u"abcdefghijklmnopqrst";  // 20 characters, 100 px
 };
 
-TEST_F(Truncation, ModeZeroPassesTheStringThroughUntouched) {
+TEST_F(Truncation, EachModeCutsOnlyWhatDoesNotFitAndAnEllipsisCostsOneMoreCharacter) {
   EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationNone, 12)), "abcdefghijklmnopqrst");
-}
-
-TEST_F(Truncation, AStringThatFitsIsReturnedUnchangedInEveryMode) {
   for (auto mode : {kTextTruncationEnd, kTextTruncationEndWithEllipsis, kTextTruncationPathEllipsis})
     EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), mode, 100)), "abcdefghijklmnopqrst") << mode;
-}
-
-TEST_F(Truncation, CuttingTheEndKeepsTheCharactersThatFit) {
   // 42 px: eight characters (40 px) fit, the ninth would reach 45.
   EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationEnd, 42)), "abcdefgh");
-  EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationEnd, 3)), "");
-}
-
-TEST_F(Truncation, CuttingWithAnEllipsisGivesUpOneMoreCharacterForIt) {
   EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationEndWithEllipsis, 42)), "abcdefg...");
+  EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationEnd, 3)), "");
   EXPECT_EQ(UTF8(TruncateString(*font, Chars(text), kTextTruncationEndWithEllipsis, 3)), "");
 }
 
@@ -62,25 +53,22 @@ TEST_F(Truncation, DrawStringDrawsTheTruncatedText) {
   EXPECT_EQ(supplier.GetCalls()[0].point, PointT<float>(3, 20));
 }
 
-TEST(PathEllipsis, ALengthBelowEightGivesTheEllipsisAndTheEnd) {
-  UTF16String out = u"stale";
-  GeneratePathEllipsisString(u"/usr/local/share/fonts", 5, out);
-  EXPECT_EQ(UTF8(out), "...ts");
-}
-
-TEST(PathEllipsis, ALengthOfEightOrMoreStartsWithTheFirstSevenCharacters) {
-  UTF16String out;
-  GeneratePathEllipsisString(u"/usr/local/share/fonts", 14, out);
-  EXPECT_EQ(UTF8(out), "/usr/lo...onts");
-  EXPECT_EQ(out.size(), 14u);
-}
-
-TEST(PathEllipsis, ZeroAndTheFullLengthAreSpecial) {
-  UTF16String out = u"x";
-  GeneratePathEllipsisString(u"abc", 0, out);
-  EXPECT_TRUE(out.empty());
-  GeneratePathEllipsisString(u"abcdefghijk", 11, out);
-  EXPECT_EQ(UTF8(out), "abcdefghijk");
+TEST(PathEllipsis, KeepsTheFirstSevenCharactersFromALengthOfEightAndOnlyTheEndBelow) {
+  const struct {
+    const char16_t* text;
+    long length;
+    const char* result;
+  } cases[] = {
+      {u"/usr/local/share/fonts", 5, "...ts"},
+      {u"/usr/local/share/fonts", 14, "/usr/lo...onts"},
+      {u"abc", 0, ""},
+      {u"abcdefghijk", 11, "abcdefghijk"},
+  };
+  for (const auto& c : cases) {
+    UTF16String out = u"stale";
+    GeneratePathEllipsisString(c.text, c.length, out);
+    EXPECT_EQ(UTF8(out), c.result) << c.length;
+  }
 }
 
 class Underline : public ::testing::Test {

@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <random>
 
 #include "tarsel/Locale.h"
 #include "tarsel/StringUtils.h"
@@ -126,25 +125,3 @@ TEST(Calculate, LongFlatExpressionsEvaluateWithoutDepth) {
   EXPECT_DOUBLE_EQ(Calc(sum), 50000);
 }
 
-TEST(Calculate, AgreesWithDirectArithmeticOnGeneratedExpressions) {
-  std::mt19937 random(7);
-  std::uniform_int_distribution<int> operand(1, 99), op(0, 3);
-  const char16_t ops[] = {u'+', u'-', u'*', u'/'};
-  for (int round = 0; round < 500; ++round) {
-    // a op1 (b op2 c): written with parentheses so the expected value is plain.
-    int a = operand(random), b = operand(random), c = operand(random);
-    int o1 = op(random), o2 = op(random);
-    auto apply = [](double x, int o, double y) {
-      switch (o) {
-        case 0: return x + y;
-        case 1: return x - y;
-        case 2: return x * y;
-        default: return x / y;
-      }
-    };
-    double expected = apply(a, o1, apply(b, o2, c));
-    UTF16String text = NumberToString(static_cast<long>(a)) + ops[o1] + u"(" + NumberToString(static_cast<long>(b)) +
-                       u" " + ops[o2] + u" " + NumberToString(static_cast<long>(c)) + u")";
-    ASSERT_DOUBLE_EQ(Calc(text), expected) << ToStdString(UTF16to8(text));
-  }
-}

@@ -27,36 +27,24 @@ class ExecutorTest : public ::testing::Test {
 
 }  // namespace
 
-TEST_F(ExecutorTest, RegisteringTheSameThreadAgainAnswersTheSameExecutor) {
-  EXPECT_EQ(RegisterCurrentThreadAsMainThread(), mExecutor);
-  EXPECT_EQ(GetMainThreadExecutor(), mExecutor);
+TEST_F(ExecutorTest, OnlyTheRegisteredThreadIsTheMainThreadAndRegisteringAnotherMovesItThere) {
+  EXPECT_EQ(RegisterCurrentThreadAsMainThread(), mExecutor) << "registering again answers the same executor";
   EXPECT_EQ(mExecutor->GetOwnerThreadID(), GetCurrentThreadID());
-}
-
-TEST_F(ExecutorTest, OnlyTheRegisteredThreadIsTheMainThread) {
   EXPECT_TRUE(IsMainThread());
-  bool otherIsMain = true;
-  ThreadID otherID;
+  bool otherWasMain = true;
+  AsyncEventLoopAdaptorPtr otherExecutor;
   std::thread other([&] {
-    otherIsMain = IsMainThread();
-    otherID = GetCurrentThreadID();
+    otherWasMain = IsMainThread();
+    otherExecutor = RegisterCurrentThreadAsMainThread();
   });
   other.join();
-  EXPECT_FALSE(otherIsMain);
-  EXPECT_NE(otherID, GetCurrentThreadID());
-  UnregisterMainThread();
-  EXPECT_FALSE(IsMainThread());
-  EXPECT_EQ(GetMainThreadExecutor(), nullptr);
-}
-
-TEST_F(ExecutorTest, RegisteringAnotherThreadMovesTheMainThreadThereWithANewExecutor) {
-  AsyncEventLoopAdaptorPtr otherExecutor;
-  std::thread other([&] { otherExecutor = RegisterCurrentThreadAsMainThread(); });
-  other.join();
+  EXPECT_FALSE(otherWasMain);
   ASSERT_NE(otherExecutor, nullptr);
   EXPECT_NE(otherExecutor, mExecutor);
   EXPECT_FALSE(IsMainThread());
   EXPECT_EQ(GetMainThreadExecutor(), otherExecutor);
+  UnregisterMainThread();
+  EXPECT_EQ(GetMainThreadExecutor(), nullptr);
 }
 
 TEST_F(ExecutorTest, TasksPostedFromManyThreadsAllRunOnTheMainThreadInPostingOrder) {

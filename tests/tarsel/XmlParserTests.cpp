@@ -67,16 +67,6 @@ TEST(XmlParserTests, ReportsEveryEventInDocumentOrder) {
   EXPECT_EQ(expected, handler.events);
 }
 
-TEST(XmlParserTests, AttributesCanBeLookedUpByName) {
-  Attributes attributes;
-  attributes.Add("type", "signed");
-  attributes.Add("size", "32");
-  ASSERT_NE(nullptr, attributes.Find("size"));
-  EXPECT_EQ("32", *attributes.Find("size"));
-  EXPECT_EQ(nullptr, attributes.Find("Size"));
-  EXPECT_EQ(2u, attributes.Size());
-}
-
 TEST(XmlParserTests, SyntaxErrorsRaiseTheToolkitExceptionWithLineAndColumn) {
   RecordingHandler handler;
   std::string message;
