@@ -68,17 +68,14 @@ TEST_F(ButtonKeyboardTest, TabbingAwayWithTheKeyHeldLeavesTheButtonUpAndPerforms
   EXPECT_THAT(log.entries, IsEmpty());
 }
 
-TEST_F(ButtonKeyboardTest, EscapeGivesUpFocusAndTravelsOn) {
-  EXPECT_TRUE(button->UI_HasKeyboardFocus(false));
-  EXPECT_FALSE(button->UI_DoKeyboardEvent(button.get(), ui::test::KeyDownEvent(kEscape, 27)));
-  EXPECT_FALSE(button->UI_HasKeyboardFocus(false));
-}
-
-TEST_F(ButtonKeyboardTest, TheSettingCanKeepFocusOnEscape) {
+TEST_F(ButtonKeyboardTest, EscapeGivesUpFocusAndTravelsOnUnlessTheSettingKeepsIt) {
   manager.SetCustomSettingsManager(std::make_unique<ui::CustomSettingsManager>());
   manager.GetCustomSettingsManager()->Set("norvik.controls.UI_Button.LoseFocusOnESC", false);
   button->UI_DoKeyboardEvent(button.get(), ui::test::KeyDownEvent(kEscape, 27));
   EXPECT_TRUE(button->UI_HasKeyboardFocus(false));
+  manager.GetCustomSettingsManager()->Set("norvik.controls.UI_Button.LoseFocusOnESC", true);
+  EXPECT_FALSE(button->UI_DoKeyboardEvent(button.get(), ui::test::KeyDownEvent(kEscape, 27)));
+  EXPECT_FALSE(button->UI_HasKeyboardFocus(false));
 }
 
 TEST_F(ButtonKeyboardTest, ADisabledButtonIgnoresTheActivationKey) {

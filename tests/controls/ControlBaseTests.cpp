@@ -32,7 +32,7 @@ TEST_F(ControlBaseTest, ANewControlIsUnknownAndSettingUnknownAgainDoesNothing) {
   EXPECT_EQ(calls, 2);
 }
 
-TEST_F(ControlBaseTest, StateBitsReflectDownDisabledAndFocus) {
+TEST_F(ControlBaseTest, StateBitsReflectDownDisabledAndFocusAndSuppressedFocusDrawingClearsFocusWhenAskedWithCapture) {
   auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
   control->SetDownState(true);
   EXPECT_EQ(control->GetControlState(true), UI_ControlView::StateFlags(UI_ControlView::kStateDown));
@@ -42,12 +42,6 @@ TEST_F(ControlBaseTest, StateBitsReflectDownDisabledAndFocus) {
   control->SetWantsKeyboardFocus(true);
   ASSERT_TRUE(control->UI_GainKeyboardFocus(ui::kFocusChangeMouse));
   EXPECT_TRUE(control->GetControlState(true).Test(UI_ControlView::kStateFocused));
-}
-
-TEST_F(ControlBaseTest, SuppressedFocusDrawingClearsTheFocusBitOnlyWhenCheckingCapture) {
-  auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
-  control->SetWantsKeyboardFocus(true);
-  control->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
   control->SetSuppressFocusDrawing(true);
   EXPECT_TRUE(control->GetControlState(false).Test(UI_ControlView::kStateFocused));
   EXPECT_FALSE(control->GetControlState(true).Test(UI_ControlView::kStateFocused));
@@ -71,7 +65,7 @@ TEST_F(ControlBaseTest, DuringAnotherControlsPressNoOtherControlLightsUp) {
   EXPECT_TRUE(a->GetControlState(true).Test(UI_ControlView::kStateRollover));
 }
 
-TEST_F(ControlBaseTest, ASingleAmpersandMarksTheMnemonicAndIsStripped) {
+TEST_F(ControlBaseTest, ASingleAmpersandMarksTheMnemonicAndADoubledOneIsALiteral) {
   manager.EnableMnemonics();
   auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
   UTF16String out;
@@ -79,12 +73,6 @@ TEST_F(ControlBaseTest, ASingleAmpersandMarksTheMnemonicAndIsStripped) {
   EXPECT_EQ(out, UTF16String(u"Open"));
   EXPECT_EQ(control->GetMnemonicLocation(), 2);
   EXPECT_EQ(control->GetMnemonicKey(), ui::KeyboardCode::CreateFromKeyboardChar('E'));
-}
-
-TEST_F(ControlBaseTest, ADoubledAmpersandIsALiteralAndNoMnemonic) {
-  manager.EnableMnemonics();
-  auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
-  UTF16String out;
   EXPECT_FALSE(control->UI_ProcessStringAndSetMnemonic(u"Salt && Pepper", out));
   EXPECT_EQ(out, UTF16String(u"Salt & Pepper"));
   EXPECT_FALSE(control->GetMnemonicKey().IsValid());
@@ -110,16 +98,12 @@ TEST_F(ControlBaseTest, AltAloneTurnsTheUnderlinesOn) {
   EXPECT_TRUE(button->GetDisplayMnemonic());
 }
 
-TEST_F(ControlBaseTest, TheGuardCancelsWhenLeftWithoutFinish) {
+TEST_F(ControlBaseTest, TheGuardCancelsWhenLeftWithoutFinishAndSendsNothingMoreAfterFinish) {
   auto control = Add(new UI_InteractiveControlView, RectF(0, 0, 10, 10));
   log.Listen(*control);
   { ScBeginAndEndInteractiveChange change(control.get()); }
   EXPECT_THAT(log.entries, ElementsAre("begin", "cancel"));
-}
-
-TEST_F(ControlBaseTest, TheGuardSendsNothingMoreAfterFinish) {
-  auto control = Add(new UI_InteractiveControlView, RectF(0, 0, 10, 10));
-  log.Listen(*control);
+  log.entries.clear();
   {
     ScBeginAndEndInteractiveChange change(control.get());
     EXPECT_TRUE(control->IsChangePending());

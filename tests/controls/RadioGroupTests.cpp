@@ -59,31 +59,20 @@ TEST_F(RadioGroupTest, TheGroupsListenersHearTheChildsChangeAsTheGroups) {
   EXPECT_THAT(controls, ElementsAre(group.get()));
 }
 
-TEST_F(RadioGroupTest, ArrowsMoveTheSelectionAndTheFocus) {
+TEST_F(RadioGroupTest, ArrowsMoveTheSelectionAndTheFocusSkippingDisabledButtonsWithoutWrapping) {
   group->SetIndex(0);
   radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
   EXPECT_TRUE(KeyDown(radios[0].get(), kRight, 0));
   EXPECT_THAT(Values(), ElementsAre(0, 1, 0));
   EXPECT_TRUE(radios[1]->UI_HasKeyboardFocus(false));
-}
-
-TEST_F(RadioGroupTest, ArrowsDoNotWrapAtTheEnds) {
-  group->SetIndex(2);
-  radios[2]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  KeyDown(radios[1].get(), kRight, 0);
   KeyDown(radios[2].get(), kRight, 0);
-  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
-  group->SetIndex(0);
-  radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  KeyDown(radios[0].get(), kLeft, 0);
-  EXPECT_THAT(Values(), ElementsAre(1, 0, 0));
-}
-
-TEST_F(RadioGroupTest, ArrowsSkipDisabledButtons) {
-  group->SetIndex(0);
+  EXPECT_THAT(Values(), ElementsAre(0, 0, 1)) << "no wrap at the end";
   radios[1]->SetEnabled(false);
-  radios[0]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  KeyDown(radios[0].get(), kRight, 0);
-  EXPECT_THAT(Values(), ElementsAre(0, 0, 1));
+  KeyDown(radios[2].get(), kLeft, 0);
+  EXPECT_THAT(Values(), ElementsAre(1, 0, 0)) << "past the disabled button";
+  KeyDown(radios[0].get(), kLeft, 0);
+  EXPECT_THAT(Values(), ElementsAre(1, 0, 0)) << "no wrap at the start";
 }
 
 TEST_F(RadioGroupTest, ARemovedButtonLeavesTheGroup) {
@@ -137,13 +126,11 @@ class RadioGroupTabTest : public RadioGroupTest {
   ui::test::FocusableViewP before, after;
 };
 
-TEST_F(RadioGroupTabTest, TabLeavesTheGroupPastItsOtherButtons) {
+TEST_F(RadioGroupTabTest, TabAndShiftTabLeaveTheGroupPastItsOtherButtons) {
   ASSERT_EQ(FocusLeaf(), radios[1].get());
   EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9));
   EXPECT_EQ(FocusLeaf(), after.get());
-}
-
-TEST_F(RadioGroupTabTest, ShiftTabLeavesTheGroupBackwards) {
+  radios[1]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
   EXPECT_TRUE(KeyDown(radios[1].get(), kTab, 9, ModKeys(ui::kModKeyShift)));
   EXPECT_EQ(FocusLeaf(), before.get());
 }

@@ -128,15 +128,6 @@ TEST_F(ToggleButtonTest, ATextButtonIsMeasuredWithoutASupplierInTheManager) {
   EXPECT_EQ(empty->UI_GetRecommendedSize().x, 0);
 }
 
-TEST_F(ToggleButtonTest, ModifiedNamesSwapTheLabelWhileTheKeysAreHeld) {
-  UI_TextButtonP button(new UI_TextButton(u"Delete"));
-  button->InsertModifiedName(ModKeys(ui::kModKeyAlt), u"Delete All");
-  button->ModKeyChanged(ModKeys(ui::kModKeyAlt));
-  EXPECT_EQ(button->GetText(), UTF16String(u"Delete All"));
-  button->ModKeyChanged(ModKeys());
-  EXPECT_EQ(button->GetText(), UTF16String(u"Delete"));
-}
-
 TEST_F(ToggleButtonTest, ReturnActivatesOnlyWithTheLegacyActivationOn) {
   auto button = Add(new UI_TextButton(u"OK"), RectF(10, 10, 60, 20));
   log.ListenChanged(*button);
