@@ -10,7 +10,8 @@ class BasicSurfaceReferenceInterface : public SurfaceInterface {
  public:
   // inRect, when given, is the part of the inner surface this one stands for,
   // in the inner surface's current user space (see ClipToReferenceSurface).
-  BasicSurfaceReferenceInterface(SupplierInterface const* inSupplier, SurfaceInterface* inSurface, bool inFlag,
+  // The buffering wish is the back end's to honour; forwarding ignores it.
+  BasicSurfaceReferenceInterface(SupplierInterface const* inSupplier, SurfaceInterface* inSurface, bool inBuffered,
                                  tarsel::geom::RectT<long> const* inRect);
 
   // Clips the inner surface to the reference rectangle, winding fill.
@@ -75,7 +76,6 @@ class BasicSurfaceReferenceInterface : public SurfaceInterface {
 
  private:
   boost::intrusive_ptr<SurfaceInterface> mSurface;
-  bool mFlag;
   bool mHasRect;
   tarsel::geom::RectT<long> mRect;
 };

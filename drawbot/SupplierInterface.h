@@ -75,9 +75,15 @@ class SupplierInterface : public tarsel::utility::RefCountedObject {
 
   bool GetShadersEnabled() const { return mShadersEnabled; }
   void SetShadersEnabled(bool inEnabled) { mShadersEnabled = inEnabled; }
+  // A supplier whose output is resampled after drawing (a scaled display, a
+  // print raster) needs smoothing even for images drawn at their natural size,
+  // which then keep the surface's anti-aliasing instead of being snapped.
+  bool GetSmoothingNeeded() const { return mSmoothingNeeded; }
+  void SetSmoothingNeeded(bool inNeeded) { mSmoothingNeeded = inNeeded; }
 
  private:
   bool mShadersEnabled = true;
+  bool mSmoothingNeeded = false;
 };
 
 using SupplierInterfaceP = boost::intrusive_ptr<SupplierInterface>;

@@ -9,9 +9,9 @@ using tarsel::geom::PointT;
 using tarsel::geom::RectT;
 
 BasicSurfaceReferenceInterface::BasicSurfaceReferenceInterface(SupplierInterface const* inSupplier,
-                                                               SurfaceInterface* inSurface, bool inFlag,
+                                                               SurfaceInterface* inSurface, bool,
                                                                RectT<long> const* inRect)
-    : SurfaceInterface(inSupplier), mSurface(inSurface), mFlag(inFlag), mHasRect(inRect != nullptr) {
+    : SurfaceInterface(inSupplier), mSurface(inSurface), mHasRect(inRect != nullptr) {
   if (inRect) mRect = *inRect;
 }
 

@@ -193,7 +193,7 @@ void SurfaceInterface::DrawImage(SupplierInterface const& inSupplier, ImageInter
   MatrixT<float> place = MatrixT<float>::Translation(inDest.left, inDest.top);
   // Only the horizontal factor decides: a destination as wide as the source
   // draws the image at its natural size, clipped to the destination.
-  const bool natural = std::fabs(scaleX - 1.0) <= 1e-12 * std::fabs(scaleX);
+  const bool natural = std::fabs(scaleX - 1.0) <= 1e-12 * std::fabs(scaleX) && !inSupplier.GetSmoothingNeeded();
   if (natural)
     SetAntiAliasPolicy(kAntiAliasNone);
   else

@@ -155,6 +155,9 @@ TEST(DrawImageScaled, ANaturalSizeDrawTurnsAntiAliasingOffOnlyInsideItsState) {
   EXPECT_EQ(supplier.GetCalls()[6].antiAlias, kAntiAlias);
   EXPECT_EQ(supplier.GetCalls()[6].transform, tarsel::geom::MatrixT<float>(2, 0, 0, 1, 5, 5));
   EXPECT_EQ(surface->GetAntiAliasPolicy(), kAntiAlias);
+  supplier.SetSmoothingNeeded(true);
+  surface->DrawImage(supplier, *image, RectT<float>(5, 5, 8, 16), nullptr, 1);
+  EXPECT_EQ(supplier.GetCalls()[10].transform, tarsel::geom::MatrixT<float>(1, 0, 0, 2, 5, 5)) << "scaled, smoothed";
 }
 
 TEST(SurfaceImages, AnOffscreenSurfaceGivesItsPixelsAsAnImage) {

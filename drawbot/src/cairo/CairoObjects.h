@@ -310,13 +310,22 @@ class OSSurfaceInterface : public SurfaceInterface {
   std::vector<State> mStates;
 };
 
-// A surface over another one's state, clipped to a rectangle; policies and
-// the state stack are those of the surface it refers to.
+// A surface over another one's state, standing for the part of it that the
+// outer clip bounds and the given rectangle share; policies and the state
+// stack are those of the surface it refers to. Windows paint through a back
+// buffer already, so even a buffered reference draws straight through the
+// outer surface's context, in its device space.
 class OSReferenceSurface : public BasicSurfaceReferenceInterface {
  public:
+  // inReference: the part stood for, from ReferenceRect.
   OSReferenceSurface(SupplierInterface const* inSupplier, SurfaceInterface* inSurface, bool inFlag,
-                     RectT<long> const* inRect);
+                     RectT<long> const& inReference);
   ~OSReferenceSurface() override;
+
+  // The outer clip bounds restricted to inRect (when given). An empty result
+  // means the reference cannot stand for anything and falls back to the whole
+  // outer surface.
+  static RectT<long> ReferenceRect(SurfaceInterface* inSurface, RectT<long> const* inRect);
 };
 
 }  // namespace norvik::drawbot::cairo

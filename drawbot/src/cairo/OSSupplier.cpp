@@ -164,7 +164,7 @@ SurfaceInterface* OSSupplier::NewReferenceSurface(SurfaceInterface* inSurface, b
   if (inSurface == nullptr || dynamic_cast<OSSurfaceInterface*>(inSurface->GetOutputSurface()) == nullptr)
     ThrowDrawingError(
         "$$$/norvik/drawbot/Error/OSSupplier/UnableToCreateReference=Unable to create drawing reference.");
-  return new OSReferenceSurface(this, inSurface, inFlag, inRect);
+  return new OSReferenceSurface(this, inSurface, inFlag, OSReferenceSurface::ReferenceRect(inSurface, inRect));
 }
 
 SurfaceInterface* OSSupplier::NewOffscreenSurface(unsigned long inWidth, unsigned long inHeight, bool) const {

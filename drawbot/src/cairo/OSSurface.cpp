@@ -371,12 +371,18 @@ void OSSurfaceInterface::Flush() {
 }
 
 OSReferenceSurface::OSReferenceSurface(SupplierInterface const* inSupplier, SurfaceInterface* inSurface,
-                                       bool inFlag, RectT<long> const* inRect)
-    : BasicSurfaceReferenceInterface(inSupplier, inSurface, inFlag, inRect) {
+                                       bool inFlag, RectT<long> const& inReference)
+    : BasicSurfaceReferenceInterface(inSupplier, inSurface, inFlag, inReference.IsEmpty() ? nullptr : &inReference) {
   inSurface->PushStateStack();
-  if (inRect && !inRect->IsEmpty()) ClipToReferenceSurface(inSupplier);
+  // An empty part comes without a rectangle: the fallback clips nothing.
+  ClipToReferenceSurface(inSupplier);
 }
 
 OSReferenceSurface::~OSReferenceSurface() { GetReferencedSurface()->PopStateStack(); }
+
+RectT<long> OSReferenceSurface::ReferenceRect(SurfaceInterface* inSurface, RectT<long> const* inRect) {
+  const RectT<long> bounds = inSurface->GetClipBounds();
+  return inRect ? bounds.Intersection(*inRect) : bounds;
+}
 
 }  // namespace norvik::drawbot::cairo
