@@ -23,11 +23,12 @@ class DrawButtonText : public DrawButtonFace {
   float mIndent;
 };
 
-// The image, scaled and centred on whole pixels, faded when disabled.
+// The image, scaled and centred on whole pixels, faded when disabled, and
+// clipped inside a border kept free on each side.
 class DrawButtonPicture : public DrawButtonFace {
  public:
   DrawButtonPicture(const DrawParameters& inParams, const drawbot::ImageInterface& inImage, float inScale,
-                    float inAlpha);
+                    float inAlpha, float inImageBorder = 0);
   void operator()(tarsel::utility::Flags<unsigned long> inState, const tarsel::geom::RectT<float>& inRect,
                   const tarsel::geom::PointT<float>& inOffset, drawbot::Drawbot& inDrawbot, const ui::Theme& inTheme,
                   const ColorChangeMap* inMap) const override;
@@ -37,6 +38,7 @@ class DrawButtonPicture : public DrawButtonFace {
   const drawbot::ImageInterface& mImage;
   float mScale;
   float mAlpha;
+  float mImageBorder;
 };
 
 }  // namespace norvik::controls

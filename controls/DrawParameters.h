@@ -185,11 +185,15 @@ class DrawPictureButtonParameters : public DrawButtonParameters {
   void SetScale(float inScale) { mScale = inScale; }
   float GetAlpha() const { return mAlpha; }
   void SetAlpha(float inAlpha) { mAlpha = inAlpha; }
+  // Space kept free between the face's rectangle and the image.
+  float GetImageBorder() const { return mImageBorder; }
+  void SetImageBorder(float inBorder) { mImageBorder = inBorder; }
 
  private:
   const drawbot::ImageInterface* mImage = nullptr;
   float mScale = 1;
   float mAlpha = 1;
+  float mImageBorder = 0;
 };
 
 class DrawCheckBoxParams : public DrawButtonParameters, public DrawTextControlBaseParameters {

@@ -109,6 +109,9 @@ class UI_Button : public UI_InteractiveControlView, public UI_ColorChangeSupport
  protected:
   // Fills the button part of a record from this button's settings.
   void FillButtonParameters(DrawButtonParameters& ioParams) const;
+  // Inside a dialog, the button that holds focus draws as the dialog's
+  // default button; a default button with focus takes the second stroke size.
+  void FillDefaultAppearance(DrawButtonParameters& ioParams) const;
   ModKeys GetCurrentModKeys() const { return mCurrentModKeys; }
   const std::vector<std::pair<ModKeys, UTF16String>>& GetModifiedToolTips() const { return mModifiedToolTips; }
   ModKeys GetModifierKeyMask() const { return mModifierKeyMask; }

@@ -21,12 +21,17 @@ class UI_PictureButton : public UI_Button, public ResourceImageSource {
   void SetImageSupplyFunction(const ImageSupplyFunction& inFunction);
   void SetScale(float inScale);
   void SetAlpha(float inAlpha);
+  // Space kept free around the image: the image is clipped inside it, and the
+  // recommended size is the scaled image with the border on each side.
+  void SetImageBorder(float inBorder);
+  float GetImageBorder() const { return mImageBorder; }
   // The image for the current state from the supply function, else null.
   const drawbot::ImageInterface* GetImage() const;
   // Return (with no modifier) also activates the button while it has focus.
   void SetSupportLegacyWindowsKeyboardActivation(bool inOn) { mReturnActivates = inOn; }
   bool UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
+  PointF UI_GetRecommendedSize() const override;
 
   // Paints the bevel and, when the record has one, its image as the face.
   static void Draw(const DrawPictureButtonParameters& inParams, drawbot::Drawbot& inDrawbot);
@@ -50,6 +55,7 @@ class UI_PictureButton : public UI_Button, public ResourceImageSource {
   ImageSupplyFunction mSupply;
   float mScale = 1;
   float mAlpha = 1;
+  float mImageBorder = 0;
   bool mReturnActivates = false;
 };
 

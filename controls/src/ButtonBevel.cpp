@@ -172,6 +172,9 @@ void BevelPainter::Paint(const RectF& inRect) {
   }
   const float fillInset = disabled && !down ? 0.0f : 1.0f;
   const RectF rf = Inset(r1, fillInset);
+  // The inner gradient is the container's fill and its ring belongs with it:
+  // a picture button whose container is hidden at rest shows its image alone,
+  // whatever its inner-gradient and ring flags say.
   if (container && mParams.ShouldDrawInnerGradient()) Gradient(rf, FillGradient());
   if (container && mParams.ShouldDrawInnerBevelOutline()) {
     if (disabled && !down) {

@@ -3,6 +3,7 @@
 #include "controls/ButtonInputCapture.h"
 #include "ui/KeyboardEvent.h"
 #include "ui/MouseEvent.h"
+#include "ui/UI_DialogHost.h"
 #include "ui/UI_ModKeyNotifier.h"
 #include "ui/UI_NodeManager.h"
 
@@ -295,6 +296,12 @@ void UI_Button::FillButtonParameters(DrawButtonParameters& ioParams) const {
     ioParams.SetDrawContainer(false);
     ioParams.SetDrawOutline(false);
   }
+}
+
+void UI_Button::FillDefaultAppearance(DrawButtonParameters& ioParams) const {
+  if (UI_HasKeyboardFocus(false) && ui::UI_DialogHost::FindFor(this)) ioParams.SetDefaultAppearance(true);
+  if (ioParams.GetDefaultAppearance() && ioParams.GetControlState().Test(kStateFocused))
+    ioParams.SetStrokeSize(mStrokeSizes.second);
 }
 
 void UI_Button::UI_Draw(drawbot::Drawbot* inDrawbot) {

@@ -47,6 +47,19 @@ void UI_PictureButton::SetScale(float inScale) {
   UI_Invalidate(nullptr, 0);
 }
 
+void UI_PictureButton::SetImageBorder(float inBorder) {
+  if (mImageBorder == inBorder) return;
+  mImageBorder = inBorder;
+  UI_Invalidate(nullptr, 0);
+}
+
+UI_PictureButton::PointF UI_PictureButton::UI_GetRecommendedSize() const {
+  const drawbot::ImageInterface* image = FindImage();
+  if (!image) return UI_Button::UI_GetRecommendedSize();
+  return PointF(static_cast<float>(image->GetWidth()) * mScale + 2 * mImageBorder,
+                static_cast<float>(image->GetHeight()) * mScale + 2 * mImageBorder);
+}
+
 void UI_PictureButton::SetAlpha(float inAlpha) {
   if (mAlpha == inAlpha) return;
   mAlpha = inAlpha;
@@ -97,7 +110,8 @@ void UI_PictureButton::Draw(const DrawPictureButtonParameters& inParams, drawbot
     UI_Button::Draw(inParams, inDrawbot);
     return;
   }
-  const DrawButtonPicture face(inParams, *inParams.GetImage(), inParams.GetScale(), inParams.GetAlpha());
+  const DrawButtonPicture face(inParams, *inParams.GetImage(), inParams.GetScale(), inParams.GetAlpha(),
+                               inParams.GetImageBorder());
   DrawPictureButtonParameters withFace(inParams);
   withFace.SetDrawButtonFace(&face);
   UI_Button::Draw(withFace, inDrawbot);
@@ -114,12 +128,14 @@ void UI_PictureButton::UI_Draw(drawbot::Drawbot* inDrawbot) {
   params.SetDrawOutline(border);
   params.SetDrawContainer(ShouldDisplayContainerAlways() || (border && !ShouldDisplayContainerNever()));
   if (GetDownState()) params.SetOffset(params.GetOffset() + GetDownOffset());
+  FillDefaultAppearance(params);
   {
     const ScDrawingSupplier drawing(mDrawingSupplier, inDrawbot->GetSupplier());
     params.SetImage(FindImage());
   }
   params.SetScale(mScale);
   params.SetAlpha(mAlpha);
+  params.SetImageBorder(mImageBorder);
   Draw(params, *inDrawbot);
 }
 

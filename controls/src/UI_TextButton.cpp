@@ -69,7 +69,7 @@ void UI_TextButton::FillTextButtonParameters(DrawTextButtonParameters& ioParams)
   const bool lit = state.TestAny(kStateRollover | kStateDown) && !state.Test(kStateDisabled);
   ioParams.SetDrawOutline(lit && !ShouldDisplayBorderNever());
   if (GetDownState()) ioParams.SetOffset(ioParams.GetOffset() + GetDownOffset());
-  if (GetDefaultAppearance() && state.Test(kStateFocused)) ioParams.SetStrokeSize(GetStrokeSizes().second);
+  FillDefaultAppearance(ioParams);
 }
 
 void UI_TextButton::UI_Draw(drawbot::Drawbot* inDrawbot) {

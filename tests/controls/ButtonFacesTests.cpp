@@ -28,6 +28,7 @@
 #include "support/drawbot/PixelCompare.h"
 #include "support/utility/MemoryResourceManager.h"
 #include "ui/DrawbotImageResourceCache.h"
+#include "ui/UI_DialogHost.h"
 
 namespace norvik::controls::test {
 namespace {
@@ -178,6 +179,25 @@ TEST_F(ChromelessTest, TheTextIndentMovesTheLabelRight) {
   ASSERT_GE(plain, 0) << "the label paints";
   button->SetTextIndent(12);
   EXPECT_EQ(firstInkedColumn(), plain + 12);
+}
+
+class DialogContent : public ui::UI_SubView, public ui::UI_DialogHost {};
+
+TEST_F(ChromelessTest, AFocusedTextOrPictureButtonInsideADialogDrawsAsTheDefaultButton) {
+  for (UI_ButtonP button : {UI_ButtonP(new UI_TextButton(u"OK")), UI_ButtonP(new UI_PictureButton)}) {
+    auto focusedShot = [&] {
+      EXPECT_TRUE(button->UI_GainKeyboardFocus(ui::kFocusChangeMouse));
+      PixelCanvas canvas(60, 24);
+      drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+      button->UI_Draw(&drawbot);
+      return canvas.Snapshot().pixels;
+    };
+    Add(button.get(), RectF(0, 0, 60, 24))->SetWantsKeyboardFocus(true);
+    Add(new DialogContent, RectF(0, 0, 100, 40))->ChildPushBack(root->ChildRemove(button.get()));
+    const auto inDialog = focusedShot();
+    button->SetDefaultAppearance(true);
+    EXPECT_EQ(focusedShot(), inDialog) << button->UI_GetNodeID() << ": inside, focus made it the default button";
+  }
 }
 
 // ---- the check box mark ----

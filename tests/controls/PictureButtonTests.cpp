@@ -78,6 +78,18 @@ TEST_F(PictureButtonTest, ADisabledButtonThatIsUpShowsNoBorderEvenUnderTheMouse)
     for (int x = 0; x < 20; ++x) ASSERT_EQ(shot.At(x, y), 0xFFFFFFFFu) << x << "," << y;
 }
 
+TEST_F(PictureButtonTest, TheImageBorderKeepsSpaceAroundTheImageAndWidensTheRecommendedSize) {
+  auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
+  button->SetImageSupplyFunction([&](UI_PictureSupplyMessage* inMessage) { inMessage->SetImage(image.Get()); });
+  button->SetScale(5);
+  button->SetImageBorder(5);
+  EXPECT_EQ(button->UI_GetRecommendedSize(), PointF(30, 30)) << "4 x 4 at scale 5, and 5 on each side";
+  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
+  button->UI_Draw(&drawbot);
+  EXPECT_EQ(canvas.Snapshot().Alpha(3, 10), 0) << "the image is as wide as the button, but not drawn in the border";
+  EXPECT_EQ(canvas.Snapshot().At(10, 10), 0xFFFF0000u);
+}
+
 TEST_F(PictureButtonTest, AnOwnerDrawnButtonPaintsOnlyThroughItsFunction) {
   auto button = Add(new UI_OwnerDrawButton, RectF(0, 0, 20, 20));
   int calls = 0;
@@ -105,7 +117,8 @@ TEST_F(PictureButtonTest, ALockReadsThroughTheCacheItIsBoundToForTheDrawingsSupp
   auto lock = Add(new UI_LockButton, RectF(0, 0, 20, 20));
   utility::testing::MemoryResourceManager resources;
   ui::DrawbotImageResourceCache cache;
-  lock->SetResourceManagerImageCache(&resources, &cache);
+  lock->SetResourceManagerImageCache(nullptr, &cache);
+  lock->BindResourceManager(&resources);
   Press(PointF(5, 5));
   Release(PointF(5, 5));
   EXPECT_EQ(lock->GetValue(), UI_Button::kButtonOn);
