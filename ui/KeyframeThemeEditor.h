@@ -89,9 +89,9 @@ class KeyframeThemeEditor : public Theme {
   float GetTintGain() const { return mTintGain; }
 
   // Reads a key-frame document into this theme. The document replaces the
-  // tracks it names and leaves the others. On any error (a document that is
-  // not well formed, a colour or font outside this theme, a number that does
-  // not read) the toolkit's exception is raised and the theme is unchanged.
+  // tracks it names and leaves the others. A document that is not well formed
+  // (or, in strict mode, an element that lacks an attribute) raises the
+  // toolkit's exception and leaves the theme unchanged.
   void LoadKeyframes(std::string_view inXml);
 
  private:

@@ -10,9 +10,9 @@
 // The first key frame of a colour in a document clears that colour's track,
 // so a document replaces whole tracks rather than merging into them. At the
 // end of the document the brightness and scheme are set again so that the new
-// tracks take effect. Key frames and font sizes that lack a required attribute
-// are skipped; an identifier outside the theme or a number that does not read
-// raises the toolkit's exception.
+// tracks take effect. Key frames and font sizes that lack a required attribute,
+// or whose numbers do not read, are skipped (raised in strict mode);
+// identifiers beyond the theme's palette are kept as tracks.
 #include <set>
 
 #include "tarsel/XmlParser.h"
