@@ -3,6 +3,7 @@
 // lost with its window, activation asked of and given by the window manager,
 // XSETTINGS, opacity, the work area, and X errors.
 #include <unistd.h>
+#include <xcb/shape.h>
 #include <xcb/xcb.h>
 #include <xcb/xcb_icccm.h>
 
@@ -413,6 +414,29 @@ TEST_F(X11Protocol, OpacityIsTheWindowManagersOpacityHint) {
   mLayer->SetLayeredAttributes(window, 0, 255, kOSLayeredAlpha);
   SyncLayer();
   EXPECT_TRUE(Read32(window, "_NET_WM_WINDOW_OPACITY").empty()) << "opaque windows carry no hint";
+}
+
+TEST_F(X11Protocol, AColourKeyCutsItsPixelsOutOfWhatShowsAndWhatTakesThePointer) {
+  const OS_WindowHandle window = MakeShownWindow(OS_Rect(0, 0, 60, 40), 0x224466);
+  auto shapedArea = [&](xcb_shape_kind_t inKind) {
+    xcb_shape_get_rectangles_reply_t* reply =
+        xcb_shape_get_rectangles_reply(mUser, xcb_shape_get_rectangles(mUser, window, inKind), nullptr);
+    long area = -1;
+    if (reply) {
+      area = 0;
+      const xcb_rectangle_t* r = xcb_shape_get_rectangles_rectangles(reply);
+      for (int i = 0; i < xcb_shape_get_rectangles_rectangles_length(reply); ++i) area += r[i].width * r[i].height;
+    }
+    std::free(reply);
+    return area;
+  };
+  mLayer->SetLayeredAttributes(window, 0x664422, 0, kOSLayeredColorKey);  // the fill, as 0x00BBGGRR
+  SyncLayer();
+  EXPECT_EQ(shapedArea(XCB_SHAPE_SK_BOUNDING), 0) << "every pixel is the key";
+  EXPECT_EQ(shapedArea(XCB_SHAPE_SK_INPUT), 0);
+  mLayer->SetLayeredAttributes(window, 0x0000FF, 0, kOSLayeredColorKey);
+  SyncLayer();
+  EXPECT_EQ(shapedArea(XCB_SHAPE_SK_BOUNDING), 60 * 40) << "no pixel is the key";
 }
 
 TEST_F(X11Protocol, TheWorkAreaComesFromTheDesktopAndBoundsAMaximisedWindow) {

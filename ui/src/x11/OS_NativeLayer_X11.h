@@ -47,6 +47,9 @@ struct X11Window {
   bool trackLeave = false;
   bool destroying = false;
   unsigned char alpha = 255;
+  bool colorKeyed = false;     // pixels of colorKey (0x00BBGGRR) are cut out with SHAPE
+  std::uint32_t colorKey = 0;
+  bool shaped = false;
   OS_Rect normalRect;
   bool minimized = false;
   bool maximized = false;
@@ -290,6 +293,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   // paint (X11Paint.cpp)
   void Damage(X11Window& ioWindow, const OS_Rect* inRect);
   void Present(X11Window& ioWindow, cairo_region_t* inRegion);
+  // colour key (X11Shape.cpp): cuts the key's pixels out of the window's shape.
+  void ApplyColorKeyShape(X11Window& ioWindow);
   // monitors (X11Monitors.cpp)
   OS_Rect ReadWorkArea();
   // OpenGL (X11OpenGL.cpp): the GL connection, opened on first use, and the

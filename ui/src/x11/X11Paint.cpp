@@ -83,7 +83,10 @@ OS_PaintContext OS_NativeLayer_X11::BeginPaint(OS_WindowHandle inWindow) {
 
 void OS_NativeLayer_X11::EndPaint(OS_WindowHandle inWindow, const OS_PaintContext& inContext) {
   auto* region = static_cast<cairo_region_t*>(inContext.updateRegion);
-  if (X11Window* window = Find(inWindow); window && region) Present(*window, region);
+  if (X11Window* window = Find(inWindow); window && region) {
+    Present(*window, region);
+    ApplyColorKeyShape(*window);
+  }
   if (region) cairo_region_destroy(region);
 }
 
@@ -130,12 +133,15 @@ void OS_NativeLayer_X11::Present(X11Window& ioWindow, cairo_region_t* inRegion) 
 
 const drawbot::SupplierInterface* OS_NativeLayer_X11::GetDrawSupplier() const { return mSupplier.get(); }
 
-void OS_NativeLayer_X11::SetLayeredAttributes(OS_WindowHandle inWindow, std::uint32_t, unsigned char inAlpha,
-                                              unsigned inFlags) {
+void OS_NativeLayer_X11::SetLayeredAttributes(OS_WindowHandle inWindow, std::uint32_t inColorKey,
+                                              unsigned char inAlpha, unsigned inFlags) {
   X11Window* window = Find(TopLevelOf(inWindow));
   if (!window) return;
   const xcb_atom_t opacity = Atom("_NET_WM_WINDOW_OPACITY");
   window->alpha = (inFlags & kOSLayeredAlpha) ? inAlpha : 255;
+  window->colorKeyed = (inFlags & kOSLayeredColorKey) != 0;
+  window->colorKey = inColorKey;
+  ApplyColorKeyShape(*window);
   if (window->alpha == 255) {
     xcb_delete_property(mConnection, window->id, opacity);
   } else {
