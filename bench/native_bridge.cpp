@@ -77,7 +77,7 @@ void NativePaintOfLargePanel(benchmark::State& state) {
   desktop.system.Pump();
   for (auto _ : state) {
     window->UI_Invalidate(nullptr, 0);
-    window->UI_UpdateNow();
+    window->UI_UpdateNow(norvik::ui::UI_Node::kUpdateNowImmediate);
   }
   state.SetItemsProcessed(state.iterations() * kPanelColumns * kPanelRows);
 }

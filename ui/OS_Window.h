@@ -86,7 +86,7 @@ class OS_Window : public UI_Node, public UI_Window {
   bool UI_IsShown() const override;
   bool UI_AreAllParentsVisible() const override;
   void UI_Invalidate(const RectL* inRect, unsigned long inFlags) override;
-  void UI_UpdateNow() override;
+  void UI_UpdateNow(unsigned long inFlags) override;
   void UI_SetOpacity(float inOpacity) override;
   void UI_SetParent(UI_Container* inParent) override;
   drawbot::SupplierInterface* UI_GetDrawSupplier() const override;

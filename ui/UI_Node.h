@@ -106,7 +106,10 @@ class UI_Node : public UI_NodeBase {
   virtual bool UI_AreAllParentsVisible() const;
   // inRect null means the whole node; see kInvalidateKeepRendering.
   virtual void UI_Invalidate(const RectL* inRect, unsigned long inFlags);
-  virtual void UI_UpdateNow() = 0;
+  // Paints pending invalidations at once when inFlags has bit 1
+  // (kUpdateNowImmediate); without it the update waits for the loop.
+  virtual void UI_UpdateNow(unsigned long inFlags) = 0;
+  static constexpr unsigned long kUpdateNowImmediate = 1;
   virtual void UI_SetOpacity(float inOpacity) = 0;
   virtual bool UI_IsChild(const UI_NodeP& inNode) const;
   virtual void UI_SetParent(UI_Container* inParent);

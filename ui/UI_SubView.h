@@ -38,7 +38,7 @@ class UI_SubView : public UI_Node {
   // Needs the shown flag and a width and height above 0.
   bool UI_IsShown() const override;
   void UI_Invalidate(const RectL* inRect, unsigned long inFlags) override;
-  void UI_UpdateNow() override;
+  void UI_UpdateNow(unsigned long inFlags) override;
   void UI_SetOpacity(float) override {}
   void UI_SetParent(UI_Container* inParent) override;
   bool UI_SupportsDrawbot() const override { return true; }

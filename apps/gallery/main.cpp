@@ -52,7 +52,7 @@ int RenderToPNG(const gallery::GalleryOptions& inOptions, ui::KeyframeThemeEdito
     gallery::GalleryWindowP window(new gallery::GalleryWindow(page, inOptions.width, inOptions.height));
     if (inOptions.exitAfterFirstFrame) window->SetFirstFrameFunction(&ReportFirstFrame);
     system.Pump();
-    window->UI_UpdateNow();
+    window->UI_UpdateNow(norvik::ui::UI_Node::kUpdateNowImmediate);
     if (!system.WriteWindowPNG(window->GetHandle(), inPath)) {
       std::fprintf(stderr, "%s\n", Say("$$$/norvik/gallery/Error/WritePNG=Could not write the image ^0.", inPath).c_str());
       result = gallery::kExitFailure;

@@ -45,7 +45,7 @@ bool UI_DisclosureTriangleButton::UI_DoTimerNotify(long inTimerID) {
   const double elapsed = ControlClockNow() - mAnimationStart;
   if (elapsed >= 0 && elapsed < mTwirlDuration) {
     UI_Invalidate(nullptr, 0);
-    UI_UpdateNow();
+    UI_UpdateNow(kUpdateNowImmediate);
     return true;
   }
   mAnimationStart = -1;

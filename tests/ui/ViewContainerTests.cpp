@@ -52,6 +52,14 @@ TEST_F(ViewContainerTest, InvalidatingAViewRepaintsItWithItsNewColour) {
   window->UI_Invalidate(nullptr, 0);
   mSystem.Pump();
   EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(1, 0, 0));
+
+  view->red = 0.0f;
+  view->blue = 1.0f;
+  view->UI_Invalidate(nullptr, 0);
+  view->UI_UpdateNow(0);
+  EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(1, 0, 0)) << "no flag: the loop paints";
+  view->UI_UpdateNow(UI_Node::kUpdateNowImmediate);
+  EXPECT_EQ(mSystem.ReadWindowPixels(window->GetHandle()).At(30, 30), Opaque(0, 0, 1));
 }
 
 TEST_F(ViewContainerTest, ARectangleSetBeforeTheContainerHadAParentIsAppliedAgainAfterItArrives) {

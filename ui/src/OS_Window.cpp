@@ -408,7 +408,8 @@ void OS_Window::UI_Invalidate(const RectL* inRect, unsigned long inFlags) {
   UI_Node::UI_Invalidate(inRect, inFlags);
 }
 
-void OS_Window::UI_UpdateNow() {
+void OS_Window::UI_UpdateNow(unsigned long inFlags) {
+  if (!(inFlags & kUpdateNowImmediate)) return;
   if (OS_NativeLayer* layer = GetNativeLayer(); layer && mPlatformWindow) layer->UpdateWindow(mPlatformWindow);
 }
 

@@ -136,8 +136,8 @@ void UI_SubView::UI_SetMatrixOnlyForChildren(bool inOnly) {
   UI_Invalidate(nullptr, kInvalidateKeepRendering);
 }
 
-void UI_SubView::UI_UpdateNow() {
-  if (UI_Node* parent = UI_GetParentNode()) parent->UI_UpdateNow();
+void UI_SubView::UI_UpdateNow(unsigned long inFlags) {
+  if (UI_Node* parent = UI_GetParentNode()) parent->UI_UpdateNow(inFlags);
 }
 
 void UI_SubView::UI_SetCapture() {

@@ -65,7 +65,7 @@ class TestWindowNode : public FocusLogging<UI_SubView> {
   const UI_NodeTimerManager* UI_GetTimerManager(bool) const override { return &mTimers; }
   void UI_SetKeyboardFocusWithOS() override { ++mOSSetFocusCalls; }
   bool UI_WantsKeyboardFocus() const override { return mWantsFocus; }
-  void UI_UpdateNow() override { ++mUpdateNowCalls; }
+  void UI_UpdateNow(unsigned long) override { ++mUpdateNowCalls; }
 
   UI_NodeTimerManager& Timers() { return mTimers; }
   // Every record the factory made, in order, with its interval.
