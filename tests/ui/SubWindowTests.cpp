@@ -83,5 +83,17 @@ TEST_F(SubWindowTest, TheCursorOverTheNativeWindowIsTheViewsAndWithoutAProxyTher
   EXPECT_EQ(view->cursorPoints.size(), 1u);
 }
 
+TEST_F(SubWindowTest, AViewInATreeWhoseWindowGetsItsHandleLaterGetsItsNativeWindowThen) {
+  boost::intrusive_ptr<OS_Window> window(new OS_Window);
+  auto view = AddSubWindowView(window.get(), 30, 40);
+  EXPECT_FALSE(view->GetSubWindow()) << "no handle to make a child of";
+  window->UI_CreateWindow(u"late", 0, UI_Node::RectL(0, 0, 300, 200), kOSStylePopup | kOSStyleVisible, 0);
+  ASSERT_TRUE(view->GetSubWindow());
+  const OS_WindowHandle handle = view->GetSubWindow()->GetHandle();
+  ASSERT_NE(handle, 0u);
+  EXPECT_EQ(mLayer.GetParent(handle), window->GetHandle());
+  EXPECT_EQ(mLayer.GetClientRect(handle), OS_Rect(0, 0, 100, 50));
+}
+
 }  // namespace
 }  // namespace norvik::ui::test

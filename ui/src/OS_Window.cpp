@@ -150,6 +150,16 @@ void OS_Window::UI_DefaultHandleOSEvent(OS_Event* inEvent) {
 
 // ---- attaching ----
 
+namespace {
+// A tree built before its window had a handle learns that it now has one:
+// native children of views (sub windows) can be made only from then on.
+void AnnounceHandle(OS_Window& inWindow) {
+  UI_NodeProtector protect(&inWindow);
+  const UI_Container::ChildList children(inWindow.ChildBegin(), inWindow.ChildEnd());
+  for (const UI_NodeP& child : children) child->UI_DispatchNodeChange(UI_Node::kNodeChangeWindowMoved);
+}
+}  // namespace
+
 void OS_Window::UI_AttachOSWindow(OS_WindowHandle inHandle) {
   mPlatformWindow = inHandle;
   if (OS_NativeLayer* layer = GetNativeLayer())
@@ -170,6 +180,7 @@ void OS_Window::UI_AttachWindow(OS_WindowHandle inHandle) {
   UI_Initialize();
   UI_AttachOSWindow(inHandle);
   layer->SubclassWindow(inHandle);
+  AnnounceHandle(*this);
 }
 
 OS_WindowHandle OS_Window::UI_CreateWindow(const UTF16String& inTitle, OS_WindowHandle inParent, const RectL& inRect,
@@ -188,6 +199,7 @@ OS_WindowHandle OS_Window::UI_CreateWindow(const UTF16String& inTitle, OS_Window
   params.createParam = static_cast<UI_Node*>(this);
   const OS_WindowHandle handle = layer->CreateWindow(params);
   if (handle == 0) mPlatformWindow = 0;
+  if (handle != 0) AnnounceHandle(*this);
   return handle;
 }
 

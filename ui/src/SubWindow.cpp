@@ -118,7 +118,10 @@ void UI_SubWindowView::UI_SizeChanged(const RectF& inLocalRect) {
 }
 
 void UI_SubWindowView::UI_NodeChanged(NodeChange inChange) {
-  if (inChange == kNodeChangeParent && !mSubWindow && UI_GetParentNode()) CreateSubWindow();
+  // Made when the view joins a tree, and again whenever the tree's window
+  // may have gained the handle that the first try lacked.
+  if ((inChange == kNodeChangeParent || inChange == kNodeChangeWindowMoved) && !mSubWindow && UI_GetParentNode())
+    CreateSubWindow();
   SyncSubWindowBounds();
   if (inChange == kNodeChangeVisibility && mSubWindow) {
     UI_NodeProtector protect(this);
