@@ -42,6 +42,11 @@ class IArrangeable {
   // this one replaces in the tree.
   void TakeOverFrom(IArrangeable const& inReplaced);
   RectF LastRectangle() const { return mLastRect; }
+  // At the root: the rectangle moved to inOrigin and took everything placed
+  // in it along, as a view's children go with the view. Nothing is placed
+  // now; the next placement from the last rectangle starts there, instead of
+  // putting the children back where the old origin was.
+  void MoveLastRectangle(PointF const& inOrigin);
 
  protected:
   // Called on a parent while one of its children is being destroyed, so that

@@ -45,14 +45,14 @@ class UI_ArrangementView : public UI_SubView, public arrange::DefaultGroup<arran
   void SetDimensions(PointF const& inSize) override;
 
  private:
-  class Separator;
+  class UI_ArrangeableSeparator;
 
   arrange::IArrangeable* ArrangeableOf(UI_Node& inChild) const;
   bool IsOwnSeparator(UI_Node* inChild) const;
 
   bool mSeparatorsEnabled = false;
   bool mSettingDimensions = false;
-  std::vector<boost::intrusive_ptr<Separator>> mSeparators;
+  std::vector<boost::intrusive_ptr<UI_ArrangeableSeparator>> mSeparators;
   std::map<UI_Node*, std::unique_ptr<arrange::ArrangeableNodeBridge>> mBridges;
 };
 

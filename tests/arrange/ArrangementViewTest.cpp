@@ -43,6 +43,23 @@ TEST(ArrangementView, OnlyTheRootArrangesAndNestedChildrenLandInTheirParentsSpac
   EXPECT_EQ(c->UI_GetLocalRectF(true), RectF(0, 10, 40, 10)) << "a nested view does not arrange itself";
 }
 
+TEST(ArrangementView, ARootMovedWithItsParentPlacesItsChildrenInItsOwnSpaceAfterAnInvalidation) {
+  Window window;
+  boost::intrusive_ptr<UI_SubView> panel(new UI_SubView);
+  panel->UI_Show(true);
+  window.host->ChildPushBack(panel);
+  panel->UI_SetLocalRectF(RectF(0, 0, 300, 200));
+  boost::intrusive_ptr<UI_ArrangementView> view(new UI_ArrangementView(arrange::kGroupRow));
+  auto a = Sized(30, 20), b = Sized(40, 10);
+  view->ChildPushBack(a);
+  view->ChildPushBack(b);
+  panel->ChildPushBack(view);
+  view->UI_SetLocalRectF(RectF(10, 10, 200, 50));
+  panel->UI_SetLocalRectF(RectF(50, 40, 300, 200));
+  view->SetHorizontalSpacing(5);
+  EXPECT_EQ(b->UI_GetLocalRectF(true), RectF(35, 0, 40, 10));
+}
+
 TEST(ArrangementView, SeparatorsOnThreeChildrenMakeTwoNodesBetweenThem) {
   Window window;
   boost::intrusive_ptr<UI_ArrangementView> view(new UI_ArrangementView(arrange::kGroupRow));

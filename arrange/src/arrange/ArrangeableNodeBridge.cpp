@@ -18,6 +18,13 @@ std::uint8_t Binding(ui::UI_Node& inNode) {
 ArrangeableNodeBridge::ArrangeableNodeBridge(ui::UI_Node& inNode, IArrangeable* inParent)
     : Single(inParent), mNode(inNode) {}
 
+// The node lands on whole pixels, so it asks for whole pixels. With fractions
+// left in, candidates that cover the same area would waste amounts that differ
+// by rounding alone, and the choice would fall to that noise instead of to the
+// next rule (the smaller minimum area).
+float ArrangeableNodeBridge::NaturalWidth() const { return std::ceil(mNode.UI_GetRecommendedSize().x); }
+float ArrangeableNodeBridge::NaturalHeight() const { return std::ceil(mNode.UI_GetRecommendedSize().y); }
+
 bool ArrangeableNodeBridge::HorizontallyExpandable() const {
   return (Binding(mNode) & ui::UI_SubView::kBindWidthGrows) != 0;
 }

@@ -127,6 +127,12 @@ void IArrangeable::EnableArrangement(bool inEnable) {
   if (inEnable) root.Arrange(root.mLastRect);
 }
 
+void IArrangeable::MoveLastRectangle(PointF const& inOrigin) {
+  IArrangeable& root = Root();
+  root.mLastRect.left = SaneCoordinate(inOrigin.x);
+  root.mLastRect.top = SaneCoordinate(inOrigin.y);
+}
+
 void IArrangeable::TakeOverFrom(IArrangeable const& inReplaced) {
   mLastRect = inReplaced.mLastRect;
   mArrangementEnabled = inReplaced.mArrangementEnabled;

@@ -7,7 +7,7 @@
 namespace norvik::ui {
 
 // A divider that the arrangement sizes to the gap between two children.
-class UI_ArrangementView::Separator : public UI_Divider, public arrange::ISeparator {
+class UI_ArrangementView::UI_ArrangeableSeparator : public UI_Divider, public arrange::ISeparator {
  public:
   void Arrange(RectF const& inRect) override {
     UI_NodeP protector(this);
@@ -39,7 +39,7 @@ arrange::IArrangeable* UI_ArrangementView::ArrangeableOf(UI_Node& inChild) const
 
 bool UI_ArrangementView::IsOwnSeparator(UI_Node* inChild) const {
   return std::any_of(mSeparators.begin(), mSeparators.end(),
-                     [inChild](const boost::intrusive_ptr<Separator>& s) { return s.get() == inChild; });
+                     [inChild](const boost::intrusive_ptr<UI_ArrangeableSeparator>& s) { return s.get() == inChild; });
 }
 
 void UI_ArrangementView::ChildAdded(UI_Node* inChild) {
@@ -72,6 +72,12 @@ void UI_ArrangementView::UI_NodeChanged(NodeChange inChange) {
   // Our own geometry changes come from the arrangement or from the parent's
   // layout; a change of parent is handled in UI_SetParent.
   if (inChange == kNodeChangeVisibility) Invalidate();
+  // A root that moves (or whose ancestors move) takes its children along in
+  // its own space; its rectangle in global coordinates must follow, or the
+  // next placement after an invalidation would use the old origin.
+  const bool moved = inChange == kNodeChangeGeometry || inChange == kNodeChangeParent ||
+                     inChange == kNodeChangeWindowMoved;
+  if (moved && !Arrangeable().Parent()) Arrangeable().MoveLastRectangle(UI_LocalToGlobalF(PointF(0, 0)));
 }
 
 void UI_ArrangementView::UI_SetParent(UI_Container* inParent) {
@@ -104,14 +110,14 @@ bool UI_ArrangementView::VisitChildren(boost::function<bool(arrange::IArrangeabl
 
 arrange::ISeparator* UI_ArrangementView::BuildSeparator() {
   if (!mSeparatorsEnabled) return nullptr;
-  boost::intrusive_ptr<Separator> separator(new Separator);
+  boost::intrusive_ptr<UI_ArrangeableSeparator> separator(new UI_ArrangeableSeparator);
   mSeparators.push_back(separator);
   ChildPushBack(separator);
   return separator.get();
 }
 
 void UI_ArrangementView::ClearSeparators() {
-  std::vector<boost::intrusive_ptr<Separator>> separators;
+  std::vector<boost::intrusive_ptr<UI_ArrangeableSeparator>> separators;
   separators.swap(mSeparators);
   // Still listed while they leave, so that their removal is not taken for a
   // child's.
