@@ -27,8 +27,10 @@ TEST_F(TextLayoutTest, OneLineOfTextStaysSingleLineAndLongTextWraps) {
   UTF16String paragraph;
   for (int i = 0; i < 12; ++i) paragraph += u"The document has changes that were never saved. ";
   boost::intrusive_ptr<UI_StaticText> longText(new UI_StaticText(paragraph));
+  longText->UI_SetLocalRectF(RectF(20, 30, 50, 10));
   UI_TextLayout longLayout(longText, 300);
   EXPECT_TRUE(longText->IsMultiLine());
+  EXPECT_EQ(longText->UI_GetLocalRectF(true).Origin(), PointF(20, 30)) << "measuring leaves the text in place";
   EXPECT_EQ(longLayout.GetInitialSize().x, 302);
   EXPECT_GT(longLayout.GetInitialSize().y, 3 * single.y) << "the wrapped height, not one line's";
 }

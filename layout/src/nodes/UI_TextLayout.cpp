@@ -8,7 +8,9 @@ UI_TextLayout::UI_TextLayout(controls::UI_StaticTextP inText, float inWidth, dra
     : UI_NodeLayout(inText, inText ? Measure(inText.get(), SanitizeExtent(inWidth)) : PointF()) {}
 
 PointF UI_TextLayout::Measure(controls::UI_StaticText* inText, float inWidth) {
-  RectF rect = inText->UI_GetLocalRectF(false);
+  // Only the width is the measure's business: the text keeps its place until
+  // the layout that measured it is placed, which may never happen.
+  RectF rect = inText->UI_GetLocalRectF(true);
   rect.width = inWidth;
   inText->UI_SetLocalRectF(rect);
   inText->SetMultiLine(true);
