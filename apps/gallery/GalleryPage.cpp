@@ -49,7 +49,7 @@ void GalleryPage::ShowPage(GalleryPageID inPage) {
       inPage == GalleryPageID::kButtons
           ? Text("$$$/norvik/gallery/Subtitle/Buttons=Every kind of button in every state, and working ones to try")
       : inPage == GalleryPageID::kLayout
-          ? Text("$$$/norvik/gallery/Subtitle/Layout=Dialogs composed by the layout builder, and grid views")
+          ? Text("$$$/norvik/gallery/Subtitle/Layout=Arrangements that reflow, dialogs composed by the layout builder, grid views")
       : inPage == GalleryPageID::kNumbers
           ? Text("$$$/norvik/gallery/Subtitle/Numbers=Typed expressions evaluated per field unit, number formats and "
                  "steps")

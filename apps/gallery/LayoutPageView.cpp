@@ -9,6 +9,13 @@ namespace norvik::gallery {
 
 LayoutPageView::LayoutPageView() {
   UI_SetNodeID("page-layout");
+  mDemoSection.reset(new SectionView(
+      "$$$/norvik/gallery/Section/Arrangement=An arrangement view: at each size the best-fitting placement wins"));
+  mDemoSection->UI_SetNodeID("section-arrangement");
+  mDemo.reset(new ArrangementDemoView());
+  mDemo->SetHeightMayChangeFunction([this] { Arrange(); });
+  AddGalleryChild(this, mDemoSection);
+  AddGalleryChild(mDemoSection.get(), mDemo);
   mPanelSection.reset(new SectionView("$$$/norvik/gallery/Section/SmartLayout=A message box composed by the layout builder"));
   mPanelSection->UI_SetNodeID("section-smart-layout");
   mGridSection.reset(new SectionView("$$$/norvik/gallery/Section/GridView=A grid view with cell borders"));
@@ -57,22 +64,35 @@ void LayoutPageView::UI_SizeChanged(const RectF& inLocalRect) {
   Arrange();
 }
 
+float LayoutPageView::ArrangeDemo(float inWidth) {
+  const float inner = std::max(0.0f, inWidth - 2 * SectionView::kPadding);
+  const float height = mDemo->GetHeightForWidth(inner);
+  const float sectionHeight = height + SectionView::kHeadingHeight + SectionView::kPadding;
+  mDemoSection->UI_SetLocalRectF(RectF(0, 0, inWidth, sectionHeight));
+  const RectF content = mDemoSection->ContentRect();
+  mDemo->UI_SetLocalRectF(RectF(content.left, content.top, content.width, height));
+  return sectionHeight;
+}
+
 void LayoutPageView::Arrange() {
-  const RectF r = UI_GetLocalRectF(false);
+  const RectF page = UI_GetLocalRectF(false);
+  if (!(page.width > 0)) return;
   const float gap = 12;
   const float chrome = SectionView::kHeadingHeight + SectionView::kPadding;
+  const float top = ArrangeDemo(page.width) + gap;
+  const RectF r(0, top, page.width, std::max(0.0f, page.height - top));
   const bool sideBySide = r.width >= kSideBySideWidth;
   const float panelSectionWidth = sideBySide ? std::floor((r.width - gap) * 0.55f) : r.width;
   const float inner = std::max(0.0f, panelSectionWidth - 2 * SectionView::kPadding);
   const PointF panelSize = mPanel->GetSizeForWidth(inner);
   const float panelSectionHeight = panelSize.y + chrome + SectionView::kPadding;
-  mPanelSection->UI_SetLocalRectF(RectF(0, 0, panelSectionWidth, panelSectionHeight));
+  mPanelSection->UI_SetLocalRectF(RectF(0, r.top, panelSectionWidth, panelSectionHeight));
   const RectF content = mPanelSection->ContentRect();
   mPanel->UI_SetLocalRectF(RectF(content.left, content.top, std::min(panelSize.x, content.width), panelSize.y));
 
-  const RectF gridSection = sideBySide ? RectF(panelSectionWidth + gap, 0, r.width - panelSectionWidth - gap,
-                                               std::max(panelSectionHeight, r.height / 2))
-                                       : RectF(0, panelSectionHeight + gap, r.width,
+  const RectF gridSection = sideBySide ? RectF(panelSectionWidth + gap, r.top, r.width - panelSectionWidth - gap,
+                                               panelSectionHeight)
+                                       : RectF(0, r.top + panelSectionHeight + gap, r.width,
                                                std::max(0.0f, r.height - panelSectionHeight - gap));
   mGridSection->UI_SetLocalRectF(gridSection);
   const RectF gridContent = mGridSection->ContentRect();

@@ -64,16 +64,6 @@ class ButtonsPageTest : public testing::GalleryWindowFixture {
     }
     GalleryWindowFixture::TearDown();
   }
-  void ClickAt(const ui::UI_Node* inNode, long inX, long inY) {
-    const RectL onScreen = inNode->UI_LocalToGlobal(RectL(inX, inY, 1, 1));
-    system.AdvanceClock(1000);  // past the double-click time: each click is a single one
-    system.Click(ui::OS_Point(onScreen.left, onScreen.top));
-    system.Pump();
-  }
-  void Click(const ui::UI_Node* inNode) {
-    const RectF r = inNode->UI_GetLocalRectF(false);
-    ClickAt(inNode, static_cast<long>(r.width / 2), static_cast<long>(r.height / 2));
-  }
   RectL OnPage(const ui::UI_Node* inNode, const RectF& inLocal) {
     return InWindow(inNode, RectL(static_cast<long>(inLocal.left), static_cast<long>(inLocal.top),
                                   static_cast<long>(inLocal.width), static_cast<long>(inLocal.height)));

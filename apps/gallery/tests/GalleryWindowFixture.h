@@ -47,6 +47,16 @@ class GalleryWindowFixture : public ::testing::Test {
     const ui::OS_Point origin = system.GetLayer().ClientToScreen(window->GetHandle(), ui::OS_Point(0, 0));
     return ui::UI_Node::RectL(onScreen.left - origin.x, onScreen.top - origin.y, onScreen.width, onScreen.height);
   }
+  void ClickAt(const ui::UI_Node* inNode, long inX, long inY) {
+    const ui::UI_Node::RectL onScreen = inNode->UI_LocalToGlobal(ui::UI_Node::RectL(inX, inY, 1, 1));
+    system.AdvanceClock(1000);  // past the double-click time: each click is a single one
+    system.Click(ui::OS_Point(onScreen.left, onScreen.top));
+    system.Pump();
+  }
+  void Click(const ui::UI_Node* inNode) {
+    const ui::UI_Node::RectF r = inNode->UI_GetLocalRectF(false);
+    ClickAt(inNode, static_cast<long>(r.width / 2), static_cast<long>(r.height / 2));
+  }
 
   ui::OS_NodeManager manager;
   ui::HeadlessWindowSystem system;

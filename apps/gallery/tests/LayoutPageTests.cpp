@@ -1,8 +1,10 @@
 // The Layout page, rendered headless at two widths in both looks: the
-// message box's content stands where its layout puts it and draws its text
-// and buttons, and every cell of the grid view gets its border.
+// arrangement picks other placements at other widths and follows its
+// switches, the message box's content stands where its layout puts it and
+// draws its text and buttons, and every cell of the grid view gets its border.
 #include <algorithm>
 #include <filesystem>
+#include <set>
 #include <tuple>
 
 #include "LayoutPageView.h"
@@ -20,8 +22,9 @@ class LayoutPageLooks : public testing::GalleryWindowFixture,
     if (HasFailure() && window) {
       const std::filesystem::path dir = std::filesystem::path(NORVIK_TEST_OUTPUT_DIR) / "layout-page";
       std::filesystem::create_directories(dir);
+      const std::string name = ::testing::UnitTest::GetInstance()->current_test_info()->name();
       system.WriteWindowPNG(window->GetHandle(),
-                            (dir / ("layout-" + std::to_string(std::get<1>(GetParam())) +
+                            (dir / (name.substr(0, name.find('/')) + "-" + std::to_string(std::get<1>(GetParam())) +
                                     (std::get<0>(GetParam()) ? "-light.png" : "-dark.png")))
                                 .string());
     }
@@ -41,7 +44,48 @@ class LayoutPageLooks : public testing::GalleryWindowFixture,
       }
     return hi - lo;
   }
+  // The distinct left and top edges of the arrangement's items, checking
+  // that each is drawn.
+  std::pair<std::set<long>, std::set<long>> ItemEdges(const ArrangementDemoView& inDemo) {
+    const ui::HeadlessPixels px = Pixels();
+    std::set<long> lefts, tops;
+    for (const ui::UI_NodeP& item : inDemo.GetItems()) {
+      const RectL r = On(item.get());
+      EXPECT_GT(Spread(px, r), 20) << "each item is drawn";
+      lefts.insert(r.left);
+      tops.insert(r.top);
+    }
+    return {lefts, tops};
+  }
 };
+
+TEST_P(LayoutPageLooks, TheArrangementPicksOtherPlacementsAtOtherWidthsAndFollowsItsSwitches) {
+  const auto [light, width] = GetParam();
+  const bool wide = width >= 1280;
+  Open(light, width, 720);
+  page->ShowPage(GalleryPageID::kLayout);
+  ArrangementDemoView* demo = page->GetLayoutPage()->GetArrangementDemo();
+  EXPECT_EQ(ItemEdges(*demo).second.size(), wide ? 1u : 2u) << "lines across: as few lines as the width allows";
+
+  Click(demo->GetTypeGroup()->ChildGet(arrange::kGroupFlipping));
+  auto [lefts, tops] = ItemEdges(*demo);
+  EXPECT_EQ(tops.size(), wide ? 1u : 12u) << "row or column: a row where it fits, else a column";
+  EXPECT_EQ(lefts.size(), wide ? 12u : 1u);
+
+  Click(demo->GetSeparatorSwitch());
+  ui::UI_ArrangementView* view = demo->GetArrangementView();
+  ASSERT_EQ(view->SeparatorCount(), 11u);
+  const ui::HeadlessPixels px = Pixels();
+  for (std::size_t i = demo->GetItems().size(); i < view->ChildSize(); ++i)
+    EXPECT_GT(Spread(px, On(view->ChildGet(i))), 15) << "separator " << i << " draws its line";
+
+  Click(demo->GetCentreHorizontallySwitch());
+  lefts = ItemEdges(*demo).first;
+  if (wide)
+    EXPECT_GT(*lefts.begin(), On(view).left + 6) << "the row stands in the middle";
+  else
+    EXPECT_GT(lefts.size(), 1u) << "items of different widths are centred in the column";
+}
 
 TEST_P(LayoutPageLooks, TheMessageBoxAndTheGridDrawWhereTheirLayoutsPutThem) {
   const auto [light, width] = GetParam();
