@@ -121,8 +121,10 @@ void ArrangementDemoView::ApplySwitchesToArrangement() {
   const int index = mTypeGroup->GetIndex();
   if (index >= 0) mArrangement->SetArrangementType(static_cast<arrange::GroupArrangementType>(index));
   mArrangement->EnableSeparators(mSeparators->IsChecked());
-  mArrangement->SetHorizontalAlignment(mCentreHorizontally->IsChecked() ? arrange::kAlignHorizontalCenter : arrange::kAlignLeft);
-  mArrangement->SetVerticalAlignment(mCentreVertically->IsChecked() ? arrange::kAlignVerticalCenter : arrange::kAlignTop);
+  mArrangement->SetHorizontalAlignment(mCentreHorizontally->IsChecked() ? arrange::kAlignHorizontalCenter
+                                                                       : arrange::kAlignLeft);
+  mArrangement->SetVerticalAlignment(mCentreVertically->IsChecked() ? arrange::kAlignVerticalCenter
+                                                                   : arrange::kAlignTop);
   mArrangement->EnableArrangement(true);
 }
 

@@ -1,7 +1,6 @@
 // The layout view: children stacked at their content size by the mode, with
 // or without the margins found, scaled on resize when asked, and left to
 // their bindings when layout is off.
-#include <cmath>
 #include <limits>
 
 #include <gtest/gtest.h>
@@ -28,18 +27,12 @@ struct Stack {
     b->UI_SetLocalRectF(RectF(10, 20, 0, 0));
     hidden->UI_Show(false);
     hidden->UI_SetLocalRectF(RectF(1, 1, 2, 2));
-    for (const ui::UI_NodeP& child : {ui::UI_NodeP(a), ui::UI_NodeP(hidden), ui::UI_NodeP(b)})
-      view->ChildPushBack(child);
+    for (ui::UI_NodeP child : {ui::UI_NodeP(a), ui::UI_NodeP(hidden), ui::UI_NodeP(b)}) view->ChildPushBack(child);
   }
 };
 
 TEST(LayoutView, StacksChildrenAtTheirContentSizeByModeKeepingOrPackingTheMarginsFound) {
-  struct Case {
-    unsigned long mode;
-    bool maintainMargins;
-    RectF a, b;
-    PointF recommended;
-  };
+  struct Case { unsigned long mode; bool maintainMargins; RectF a, b; PointF recommended; };
   const Case cases[] = {
       // Vertical: b keeps the 15 between the old bottom of a and its top.
       {0, true, RectF(3, 5, 31, 10), RectF(10, 30, 20, 15), PointF(37, 50)},
@@ -54,8 +47,7 @@ TEST(LayoutView, StacksChildrenAtTheirContentSizeByModeKeepingOrPackingTheMargin
     s.view->SetMaintainMargins(c.maintainMargins);
     for (int pass = 0; pass < 2; ++pass) {
       s.view->AutoLayout(nullptr);
-      const std::string row = "mode " + std::to_string(c.mode) + (c.maintainMargins ? " with" : " without") +
-                              " margins, pass " + std::to_string(pass);
+      const std::string row = "mode " + std::to_string(c.mode) + " margins " + std::to_string(c.maintainMargins);
       EXPECT_EQ(s.a->UI_GetLocalRectF(true), c.a) << row;
       EXPECT_EQ(s.b->UI_GetLocalRectF(true), c.b) << row;
       EXPECT_EQ(s.view->UI_GetRecommendedSize(), c.recommended) << row;
@@ -65,18 +57,19 @@ TEST(LayoutView, StacksChildrenAtTheirContentSizeByModeKeepingOrPackingTheMargin
   }
 }
 
-TEST(LayoutView, TheSettersWriteTheSubViewLayoutFlagsAndOtherModesAreIgnored) {
-  UI_LayoutViewP view(new UI_LayoutView);
-  EXPECT_EQ(view->UI_GetSubViewLayoutFlags(), UI_LayoutView::kLayoutEnabled | UI_LayoutView::kMaintainMargins);
-  view->SetLayoutMode(UI_LayoutView::kLayoutModeHorizontal);
-  view->SetScaleChildren(true);
-  view->SetMaintainMargins(false);
-  EXPECT_EQ(view->UI_GetSubViewLayoutFlags(), 1 | 2 | 8);
-  view->SetLayoutMode(2);
-  EXPECT_EQ(view->GetLayoutMode(), UI_LayoutView::kLayoutModeHorizontal);
-  view->SetLayoutEnabled(false);
-  view->SetLayoutMode(UI_LayoutView::kLayoutModeVertical);
-  EXPECT_EQ(view->UI_GetSubViewLayoutFlags(), 8);
+TEST(LayoutView, TheSettersWriteTheSubViewLayoutFlagsAndWithLayoutOffNothingMoves) {
+  Stack s;
+  EXPECT_EQ(s.view->UI_GetSubViewLayoutFlags(), UI_LayoutView::kLayoutEnabled | UI_LayoutView::kMaintainMargins);
+  s.view->SetLayoutMode(UI_LayoutView::kLayoutModeHorizontal);
+  s.view->SetScaleChildren(true);
+  s.view->SetMaintainMargins(false);
+  s.view->SetLayoutMode(2);
+  EXPECT_EQ(s.view->UI_GetSubViewLayoutFlags(), 1 | 2 | 8) << "a mode other than 0 and 1 is ignored";
+  s.view->SetLayoutEnabled(false);
+  s.view->AutoLayout(nullptr);
+  s.view->UI_SetLocalRectF(RectF(0, 0, 200, 100));
+  EXPECT_EQ(s.view->UI_GetSubViewLayoutFlags(), 2 | 8);
+  EXPECT_EQ(s.a->UI_GetLocalRectF(true), RectF(3, 5, 0, 0)) << "neither laid out nor scaled";
 }
 
 TEST(LayoutView, AResizeScalesTheChildrenWhenAskedAndOtherwiseFollowsTheirBindings) {
@@ -90,15 +83,6 @@ TEST(LayoutView, AResizeScalesTheChildrenWhenAskedAndOtherwiseFollowsTheirBindin
   s.view->UI_SetLocalRectF(RectF(0, 0, 220, 100));
   EXPECT_EQ(s.a->UI_GetLocalRectF(true), RectF(6, 10, 62, 20));
   EXPECT_EQ(s.b->UI_GetLocalRectF(true), RectF(20, 60, 60, 30));
-}
-
-TEST(LayoutView, WithLayoutOffAutoLayoutLeavesTheChildrenAlone) {
-  Stack s;
-  s.view->SetLayoutEnabled(false);
-  s.view->SetScaleChildren(true);
-  s.view->AutoLayout(nullptr);
-  EXPECT_EQ(s.a->UI_GetLocalRectF(true), RectF(3, 5, 0, 0));
-  EXPECT_EQ(s.view->UI_GetRecommendedSize(), PointF(0, 0));
 }
 
 TEST(LayoutView, ANestedLayoutIsLaidOutFirstAndChildrenWithoutASizeKeepTheirs) {
