@@ -162,13 +162,10 @@ TEST_F(ButtonBarTest, TheButtonsPaintOverTheFrameAndTheSelectedOneLooksDown) {
 
 // ---- the selection rule ----
 
-TEST_F(ButtonBarTest, ANewBarIsUnknownAndShowsNoSelection) {
+TEST_F(ButtonBarTest, ANewBarShowsNoSelectionAndAClickSelectsOneButtonAndTellsTheBarsListenersOnce) {
   EXPECT_TRUE(bar->IsValueUnknown());
   EXPECT_EQ(bar->GetSelectedIndex(), -1);
   EXPECT_THAT(Values(), ElementsAre(0, 0, 0));
-}
-
-TEST_F(ButtonBarTest, AClickSelectsOneButtonAndTellsTheBarsListenersOnce) {
   Click(1);
   EXPECT_THAT(Values(), ElementsAre(0, 1, 0));
   EXPECT_EQ(bar->GetValue(), 0.5);

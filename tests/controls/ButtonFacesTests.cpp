@@ -215,17 +215,6 @@ int MarkPixels(int inValue, bool inUnknown, PixelImage* outImage = nullptr) {
   return PaintedPixels(shot);
 }
 
-TEST(CheckboxMark, TheBoxHasRoundedCorners) {
-  PixelCanvas canvas(14, 14);
-  drawbot::Drawbot drawbot(canvas.GetSupplier(), canvas.GetSurface());
-  DrawCheckBoxParams params;
-  params.SetRectF(RectF(0, 0, 14, 14));
-  UI_Checkbox::DrawHelper(params, drawbot);
-  const PixelImage shot = canvas.Snapshot();
-  EXPECT_NE(shot.At(7, 0), 0u) << "the edge is painted";
-  EXPECT_EQ(shot.At(0, 0), 0u) << "the corner is not";
-}
-
 TEST(CheckboxMark, OffIsBlankOnIsATickMixedAndUnknownAreABar) {
   PixelImage on, mixed, unknown;
   EXPECT_EQ(MarkPixels(UI_Checkbox::kOff, false), 0);

@@ -115,18 +115,6 @@ TEST_F(ControlBaseTest, TheGuardCancelsWhenLeftWithoutFinishAndSendsNothingMoreA
   EXPECT_FALSE(control->IsChangePending());
 }
 
-TEST_F(ControlBaseTest, ForwardingAChildsMessagesMakesThemTheParents) {
-  auto parent = Add(new UI_InteractiveControlView, RectF(0, 0, 100, 100));
-  UI_ButtonP child(new UI_Button);
-  std::vector<UI_ControlView*> controls;
-  parent->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
-      [&](UI_ControlChangedMessage* inMessage) { controls.push_back(inMessage->GetControl()); }));
-  child->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
-      [&](UI_ControlChangedMessage* inMessage) { parent->ForwardControlMessageFromChild(inMessage); }));
-  child->PerformAction(true, ModKeys(), false);
-  EXPECT_THAT(controls, ElementsAre(parent.get()));
-}
-
 TEST_F(ControlBaseTest, EmptyListenerEntriesAreSkipped) {
   auto control = Add(new UI_ControlView, RectF(0, 0, 10, 10));
   control->NotifyWhenChanged(ControlChangedFunctionP());

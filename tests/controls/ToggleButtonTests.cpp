@@ -18,28 +18,21 @@ using ::testing::IsEmpty;
 
 using ToggleButtonTest = ControlTest;
 
-TEST_F(ToggleButtonTest, ATwoStateCheckboxCyclesOffOnOff) {
-  auto box = Add(new UI_Checkbox(u"Loop"), RectF(10, 10, 100, 16));
-  std::vector<int> seen;
-  box->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
-      [&](UI_ControlChangedMessage*) { seen.push_back(box->GetValue()); }));
-  for (int i = 0; i < 3; ++i) {
-    Press(PointF(15, 15));
-    Release(PointF(15, 15));
+TEST_F(ToggleButtonTest, ACheckboxCyclesOffOnOffOrWithThreeStatesOffOnMixedOff) {
+  for (bool triState : {false, true}) {
+    auto box = Add(new UI_Checkbox(u"Loop"), RectF(10, 10, 100, 16));
+    box->SetTriState(triState);
+    std::vector<int> seen;
+    box->NotifyWhenChanged(ui::MakeNotification<void(UI_ControlChangedMessage*)>(
+        [&](UI_ControlChangedMessage*) { seen.push_back(box->GetValue()); }));
+    for (int i = 0; i < 4; ++i) {
+      Press(PointF(15, 15));
+      Release(PointF(15, 15));
+    }
+    const std::vector<int> expected = triState ? std::vector<int>{1, 2, 0, 1} : std::vector<int>{1, 0, 1, 0};
+    EXPECT_EQ(seen, expected) << "listeners read the new value";
+    root->ChildRemove(box.get());
   }
-  EXPECT_THAT(seen, ElementsAre(1, 0, 1)) << "listeners read the new value";
-}
-
-TEST_F(ToggleButtonTest, ATriStateCheckboxCyclesOffOnMixedOff) {
-  auto box = Add(new UI_Checkbox(u"Solo"), RectF(10, 10, 100, 16));
-  box->SetTriState(true);
-  std::vector<int> seen;
-  for (int i = 0; i < 4; ++i) {
-    Press(PointF(15, 15));
-    Release(PointF(15, 15));
-    seen.push_back(box->GetValue());
-  }
-  EXPECT_THAT(seen, ElementsAre(1, 2, 0, 1));
 }
 
 TEST_F(ToggleButtonTest, SettingACheckboxsValueSendsNothing) {
@@ -58,8 +51,9 @@ TEST_F(ToggleButtonTest, TheCheckboxSplitsItsRectangleIntoBoxAndLabel) {
   EXPECT_EQ(text, RectF(27, 0, 83, 20));
 }
 
-TEST_F(ToggleButtonTest, ClickingARadioButtonTurnsItOnAndClickingAgainKeepsItOnButStillSends) {
+TEST_F(ToggleButtonTest, ARadioButtonTurnsOnByClickOrKeyAndStaysOnButStillSends) {
   auto radio = Add(new UI_RadioButton(u"Mono"), RectF(10, 10, 100, 16));
+  radio->SetWantsKeyboardFocus(true);
   log.ListenChanged(*radio);
   Press(PointF(15, 15));
   Release(PointF(15, 15));
@@ -68,18 +62,13 @@ TEST_F(ToggleButtonTest, ClickingARadioButtonTurnsItOnAndClickingAgainKeepsItOnB
   Release(PointF(15, 15));
   EXPECT_EQ(radio->GetValue(), UI_Button::kButtonOn);
   EXPECT_THAT(log.entries, ElementsAre("changed", "changed"));
-}
-
-TEST_F(ToggleButtonTest, ARadioButtonTurnsOnFromTheKeyboard) {
-  auto radio = Add(new UI_RadioButton(u"Stereo"), RectF(10, 10, 100, 16));
-  radio->SetWantsKeyboardFocus(true);
+  radio->SetValue(UI_Button::kButtonOff);
   radio->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  KeyDown(radio.get(), 32, ' ');
-  KeyUp(radio.get(), 32, ' ');
-  EXPECT_EQ(radio->GetValue(), UI_Button::kButtonOn);
-  KeyDown(radio.get(), 32, ' ');
-  KeyUp(radio.get(), 32, ' ');
-  EXPECT_EQ(radio->GetValue(), UI_Button::kButtonOn);
+  for (int i = 0; i < 2; ++i) {
+    KeyDown(radio.get(), 32, ' ');
+    KeyUp(radio.get(), 32, ' ');
+    EXPECT_EQ(radio->GetValue(), UI_Button::kButtonOn) << "key press " << i;
+  }
 }
 
 TEST_F(ToggleButtonTest, TheDisclosureMessageArrivesOnlyAfterTheTwirl) {

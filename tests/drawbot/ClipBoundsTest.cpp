@@ -24,14 +24,6 @@ TEST(ClipBounds, IsWithinClipBoundsIsTrueOnlyForRectanglesThatTouchTheClip) {
   EXPECT_FALSE(surface->IsWithinClipBounds(RectT<long>(25, 25, 0, 10)));
 }
 
-TEST(ClipBounds, TheClipFollowsTheTransform) {
-  SurfaceP surface(NewOSSupplier(), 100, 100);
-  surface->Transform(MatrixT<float>::Translation(30, 40));
-  EXPECT_EQ(surface->GetClipBounds(), RectT<long>(-30, -40, 100, 100));
-  EXPECT_FALSE(surface->IsWithinClipBounds(RectT<long>(70, 0, 5, 5)));
-  EXPECT_TRUE(surface->IsWithinClipBounds(RectT<long>(69, 0, 5, 5)));
-}
-
 TEST(ClipBounds, MinimumClipBoundsShrinksToThePartThatTouchesTheClip) {
   RecordingSupplier supplier;
   boost::intrusive_ptr<RecordingSurface> surface(new RecordingSurface(&supplier, 1000, 1000));

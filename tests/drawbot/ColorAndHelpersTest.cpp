@@ -58,21 +58,6 @@ TEST(Swizzle, PremultiplyingAndDividingOutAlphaLeaveOpaqueAndTransparentPixelsAn
   EXPECT_EQ(std::vector<int>(px, px + 4), (std::vector<int>{1, 2, 3, 4}));
 }
 
-TEST(Profiles, BytesPerPixelFollowLayoutAndDepth) {
-  ColorDestinationProfile profile;
-  EXPECT_EQ(profile.GetPixelLayout(), kPixelLayoutARGB);
-  EXPECT_EQ(profile.GetDepth(), 8u);
-  EXPECT_EQ(profile.GetBytesPerPixel(), 4u);
-  profile.SetDepth(4);
-  EXPECT_EQ(profile.GetBytesPerPixel(), 3u);
-  profile.SetDepth(8);
-  profile.SetPixelLayout(kPixelLayoutRGB24);
-  EXPECT_EQ(profile.GetBytesPerPixel(), 3u);
-  ImageDestinationProfile image;
-  EXPECT_TRUE(image.GetBounds().IsEmpty());
-  EXPECT_TRUE(image.GetSubregion().IsEmpty());
-}
-
 struct AppData : OpaqueApplicationData {};
 
 int gCallbackCalls = 0;
@@ -192,18 +177,6 @@ TEST_F(Monitors, AColourManagedImageIsConvertedPerMonitorAndDrawnAtEachPiece) {
   EXPECT_EQ(supplier.GetCalls()[1].rect, RectT<float>(100, 0, 10, 4));
 }
 
-TEST(ShapeHelpers, TheEllipseIsFourBeziersClockwiseFromTheTop) {
-  RecordingSupplier supplier;
-  PathP path;
-  GetEllipsePath(&supplier, RectT<float>(0, 0, 20, 10), &path);
-  auto const& recorded = dynamic_cast<RecordingPath const&>(*path);
-  EXPECT_EQ(recorded.GetOps(), (std::vector<std::string>{"M", "C", "C", "C", "C", "Z"}));
-  EXPECT_EQ(recorded.GetPoints()[0], PointT<float>(10, 0));
-  EXPECT_EQ(recorded.GetPoints()[3], PointT<float>(20, 5));  // right middle
-  EXPECT_NEAR(recorded.GetPoints()[1].x, 10 + 10 * 0.5522847f, 1e-4);
-  EXPECT_EQ(recorded.GetPoints()[6], PointT<float>(10, 10));  // bottom middle
-}
-
 TEST(ShapeHelpers, ANullSupplierKeepsTheExistingPath) {
   RecordingSupplier supplier;
   PathP path(&supplier);
@@ -219,18 +192,6 @@ TEST(ShapeHelpers, ARoundedRectangleWithRadiusZeroIsAPlainRectangle) {
   EXPECT_EQ(dynamic_cast<RecordingPath const&>(*path).GetDescription(), "R 1 2 30 20");
 }
 
-TEST(ShapeHelpers, RoundedCornersUseHalfTheCornerSizeAsControlDistance) {
-  RecordingSupplier supplier;
-  PathP path;
-  GetRoundedRectPath(&supplier, RectT<float>(0, 0, 40, 20), 4, &path);
-  auto const& recorded = dynamic_cast<RecordingPath const&>(*path);
-  EXPECT_EQ(recorded.GetOps(), (std::vector<std::string>{"M", "L", "C", "L", "C", "L", "C", "L", "C", "Z"}));
-  // Top right corner: from (36, 0) with controls (38, 0) and (40, 2) to (40, 4).
-  EXPECT_EQ(recorded.GetPoints()[2], PointT<float>(38, 0));
-  EXPECT_EQ(recorded.GetPoints()[3], PointT<float>(40, 2));
-  EXPECT_EQ(recorded.GetPoints()[4], PointT<float>(40, 4));
-}
-
 TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeet) {
   RecordingSupplier supplier;
   PathP path;
@@ -239,17 +200,6 @@ TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeet) {
   // The right side: the top right corner ends where the bottom right one starts.
   EXPECT_EQ(points[4], PointT<float>(40, 5));
   EXPECT_EQ(points[5], PointT<float>(40, 5));
-}
-
-TEST(ShapeHelpers, IntegerFormsKeepAPathPixelAlignedAndAnyFloatFormClearsIt) {
-  RecordingSupplier supplier;
-  PathP path(&supplier);
-  path->MoveTo(PointT<long>(0, 0));
-  path->LineTo(PointT<long>(5, 0));
-  path->AddRect(RectT<long>(1, 1, 2, 2));
-  EXPECT_TRUE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
-  path->LineTo(PointT<float>(5, 5));
-  EXPECT_FALSE(dynamic_cast<RecordingPath const&>(*path).IsPixelAligned());
 }
 
 TEST(MemBuffers, RowsAreSixteenByteAlignedAndChannelsSwap) {

@@ -70,17 +70,6 @@ TEST(DrawCache, ARectangleWithinOnePixelRowGivesACacheOfHeightOne) {
   EXPECT_EQ(surface->PushCacheStack(RectT<float>(5, 5, 0, 10)), nullptr);
 }
 
-TEST(DrawCache, TheCacheSurfaceDrawsInTheSourcesUserSpace) {
-  SurfaceP surface(NewOSSupplier(), 100, 100);
-  surface->Transform(MatrixT<float>::Translation(10, 20));
-  auto cache = surface->PushCacheStack(RectT<float>(0, 0, 8, 8));
-  ASSERT_TRUE(cache);
-  MatrixT<float> m;
-  cache->GetSurface()->GetTransform(&m);
-  EXPECT_TRUE(m.IsIdentity());  // the cache's origin is the rectangle's corner on screen
-  EXPECT_EQ(cache->GetSurface()->GetClipBounds(), RectT<long>(0, 0, 8, 8));
-}
-
 TEST(DrawCache, DrawCachePutsThePixelsBackWhereTheyWereAfterAWholePixelScroll) {
   PixelCanvas canvas(20, 6);
   SurfaceInterface* surface = canvas.GetSurface();

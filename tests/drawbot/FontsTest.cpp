@@ -129,15 +129,6 @@ TEST(Baseline, TheSettingMakesTheBaselineFollowAscentAndDescent) {
   EXPECT_EQ(GetFontBaseline(font, RectT<float>(0, 10, 100, 20)), 25);
 }
 
-TEST(MultiLineText, NarrowerBoxesWrapIntoMoreLines) {
-  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 12);
-  UTF16String text = u"The quick brown fox jumps over the lazy dog";
-  float wide = font->MeasureMultiLineStringHeight(Chars(text), 1000, -1);
-  float narrow = font->MeasureMultiLineStringHeight(Chars(text), 60, -1);
-  EXPECT_GT(wide, 10);
-  EXPECT_GE(narrow, 3 * wide);
-}
-
 TEST(MultiLineText, WrappedTextStaysInsideItsRectangle) {
   PixelCanvas canvas(100, 80);
   FontP font(canvas.GetSupplier(), u"DejaVu Sans", u"", 12);

@@ -80,7 +80,7 @@ TEST_F(FileTests, ParentAndFullPathAreNormalised) {
   EXPECT_EQ(U(mRoot / "sub" / ".."), U(file.Parent().GetPath()));
 }
 
-TEST_F(FileTests, FoldersAreCreatedWithTheirParentsAndDeletedWithTheirContent) {
+TEST_F(FileTests, FoldersAreCreatedWithTheirParentsAndDeletedWithTheirContentButNeverOverAFile) {
   const Dir deep(mRoot / "a" / "b" / "c");
   EXPECT_FALSE(deep.Exists());
   EXPECT_TRUE(deep.Create());
@@ -91,13 +91,10 @@ TEST_F(FileTests, FoldersAreCreatedWithTheirParentsAndDeletedWithTheirContent) {
   EXPECT_TRUE(a.Delete());
   EXPECT_FALSE(a.Exists());
   EXPECT_FALSE(a.Delete()) << "nothing left to delete";
-}
-
-TEST_F(FileTests, CreatingAFolderWhereAFileStandsFails) {
-  const fs::path path = Write("plain", "x");
-  EXPECT_FALSE(Dir(path).Create());
-  EXPECT_FALSE(Dir(path).Delete()) << "Delete must not remove a file";
-  EXPECT_TRUE(File(path).Exists());
+  const fs::path plain = Write("plain", "x");
+  EXPECT_FALSE(Dir(plain).Create()) << "a file stands there";
+  EXPECT_FALSE(Dir(plain).Delete()) << "Delete must not remove a file";
+  EXPECT_TRUE(File(plain).Exists());
 }
 
 TEST_F(FileTests, PackageDirIsTheFolderOfTheRunningProgram) {

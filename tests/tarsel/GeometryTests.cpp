@@ -3,7 +3,6 @@
 #include "tarsel/Flags.h"
 #include "tarsel/MatrixT.h"
 #include "tarsel/RectT.h"
-#include "tarsel/ScaleMatrixT.h"
 #include "tarsel/ThrowError.h"
 
 using namespace tarsel::geom;
@@ -25,16 +24,6 @@ TEST(RectT, IntersectionAndUnionIgnoreEmptySides) {
   EXPECT_FALSE(a.Intersects(RectL(10, 0, 5, 5)));
 }
 
-TEST(ScaleMatrixT, ComposesAndInvertsExactly) {
-  ScaleMatrixF toParent(2, 3, 10, 20);
-  ScaleMatrixF parentToGrand = ScaleMatrixF::Translation(5, 7);
-  ScaleMatrixF both = parentToGrand.Concat(toParent);
-  PointF p(1, 1);
-  EXPECT_EQ(both.Transform(p), parentToGrand.Transform(toParent.Transform(p)));
-  EXPECT_EQ(toParent.Inverse().Transform(toParent.Transform(PointF(4, -8))), PointF(4, -8));
-  EXPECT_FALSE(ScaleMatrixF::Scale(0, 1).IsInvertible());
-}
-
 TEST(MatrixT, SingularMatrixAnswersFalseOrThrowsTheMatrixError) {
   MatrixF singular(1, 2, 2, 4, 0, 0);
   MatrixF copy = singular;
@@ -47,15 +36,6 @@ TEST(MatrixT, SingularMatrixAnswersFalseOrThrowsTheMatrixError) {
     EXPECT_STREQ(e.what(), "Matrix cannot be inverted.");
     EXPECT_EQ(e.GetKeyPath(), "tarsel/geom/matrix/Error/NonInvertableMatrix");
   }
-}
-
-TEST(MatrixT, InverseUndoesRotationAndTranslation) {
-  MatrixF m = MatrixF::Translation(10, -4).Concat(MatrixF::Rotation(0.5f)).Concat(MatrixF::Scale(2, 3));
-  MatrixF inv = m;
-  ASSERT_TRUE(inv.Invert(true));
-  PointF back = inv.Transform(m.Transform(PointF(3, 7)));
-  EXPECT_NEAR(back.x, 3, 1e-4);
-  EXPECT_NEAR(back.y, 7, 1e-4);
 }
 
 TEST(Flags, TestRequiresEveryBit) {

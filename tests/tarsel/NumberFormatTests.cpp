@@ -173,13 +173,6 @@ TEST(StringToNumber, OverflowRaisesOutOfRangeAndUnderflowReadsAsZero) {
   EXPECT_DOUBLE_EQ(StringToNumber(UTF16String(300, u'1'), kPlain), 1.1111111111111111e299);
 }
 
-TEST(StringToNumber, LocalisedReadingFollowsTheDefaultLocale) {
-  ScSetDefaultLocale german(kGerman);
-  EXPECT_DOUBLE_EQ(StringToNumber(u"1.234,5", 0), 1234.5);
-  EXPECT_DOUBLE_EQ(StringToNumber(u"1,234.5", kPlain), 1234.5);
-  EXPECT_EQ(KeyPathOfError(u"1,2,3", 0), "tarsel/utility/Error/NotANumber");
-}
-
 TEST(NumberRoundTrip, FormattedTextReadsBackAsTheRoundedValue) {
   std::mt19937 random(20261122);
   std::uniform_real_distribution<double> values(-1e7, 1e7);

@@ -80,17 +80,6 @@ TEST(Mnemonics, StrippingRemovesMarksAndUndoublesAmpersands) {
   EXPECT_EQ(out, u"&&");
 }
 
-TEST(Mnemonics, TheStrippedIndexPointsAtTheMarkedCharacterOfTheStrippedText) {
-  for (const char16_t* text : {u"E&xit", u"a && b &c", u"&&x&y&&", u"&Z"}) {
-    UTF16String stripped;
-    StripDisplayString(text, stripped);
-    long original = LocateSingleAmpersandInString(text, false);
-    long index = LocateSingleAmpersandInString(text, true);
-    ASSERT_GE(index, 0) << "text " << tarsel::utility::ToStdString(UTF16to8(text));
-    EXPECT_EQ(stripped[static_cast<std::size_t>(index)], text[original + 1]);
-  }
-}
-
 TEST(HexText, ValidatesOnlyNonEmptyHexDigitsAndWritesUpperCaseDigitsWithoutPadding) {
   EXPECT_TRUE(ValidateForHex(u"ABCDEF0123456789ff"));
   for (const char16_t* bad : {u"", u"12G4", u"#fff", u"ff "}) EXPECT_FALSE(ValidateForHex(bad));

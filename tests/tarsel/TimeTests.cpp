@@ -9,15 +9,6 @@
 
 using tarsel::utility::HighPrecisionTime;
 
-TEST(HighPrecisionTime, TicksNeverGoBackwards) {
-  HighPrecisionTime::Ticks previous = HighPrecisionTime::GetTickCount();
-  for (int i = 0; i < 10000; ++i) {
-    HighPrecisionTime::Ticks now = HighPrecisionTime::GetTickCount();
-    ASSERT_GE(now, previous);
-    previous = now;
-  }
-}
-
 TEST(HighPrecisionTime, ASleepMeasuresAtLeastItsLength) {
   const auto start = HighPrecisionTime::GetTickCount();
   std::this_thread::sleep_for(std::chrono::milliseconds(20));

@@ -86,13 +86,5 @@ TEST_F(CursorData, DocumentsThatAreNotCursorDataOfThisVersionAreRefusedWithTheir
     EXPECT_THROW(Load(text), tarsel::config::Exception);
 }
 
-TEST(LibraryCursorData, TheLibrarysOwnDocumentsPutTheHotSpotAtTheTopLeft) {
-  OS_ResourceManager resources;
-  EXPECT_TRUE(resources.HasBinary(u"CursorDataID-26", u"xml"));
-  EXPECT_TRUE(resources.HasBinary(u"CursorDataID-27", u"xml"));
-  EXPECT_EQ(LoadCursorHotSpot(u"CursorDataID-26", resources), HotSpot(0, 0));
-  EXPECT_EQ(LoadCursorHotSpot(u"CursorDataID-27", resources), HotSpot(0, 0));
-}
-
 }  // namespace
 }  // namespace norvik::utility

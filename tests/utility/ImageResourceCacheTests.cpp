@@ -126,19 +126,6 @@ TEST_F(ImageCache, AMissingReaderOrSupplierRaisesTheAccessErrorOnAMiss) {
   EXPECT_EQ(mCache.GetImage(nullptr, mPlatform, "Gripper", kImageFileTypePNG).get(), image.get());
 }
 
-TEST(NodeManagerImages, GetImageGoesThroughTheManagersCacheAndResources) {
-  ui::UI_NodeManager manager;
-  manager.SetResourceManager(std::make_unique<OS_ResourceManager>());
-  manager.SetDrawbotImageResourceCache(std::make_unique<DrawbotImageResourceCache>());
-  drawbot::SupplierInterface* platform = drawbot::NewOSSupplier();
-  const drawbot::ImageInterface* image = manager.GetImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG);
-  ASSERT_NE(image, nullptr);
-  EXPECT_EQ(image->GetWidth(), 16u);
-  EXPECT_EQ(manager.GetImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG), image);
-  EXPECT_EQ(manager.GetDrawbotImageResourceCache()->FindImage(platform, "RV4_Locked_Sm_N_D", kImageFileTypePNG).get(),
-            image);
-}
-
 TEST(NodeManagerImages, ThePlatformManagerReadsTheLibrarysOwnPicturesAsBuilt) {
   ui::OS_NodeManager manager;
   auto* resources = dynamic_cast<OS_ResourceManager*>(&manager.GetResourceManager());
