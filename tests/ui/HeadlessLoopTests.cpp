@@ -46,27 +46,6 @@ TEST_F(HeadlessLoopTest, TheLoopRunsUntilQuitAndAnswersTheExitCode) {
   EXPECT_EQ(mSystem.GetQueueLength(), 1u);
 }
 
-TEST_F(HeadlessLoopTest, NestedLoopsQuitInnermostFirst) {
-  std::vector<std::string> events;
-  mHandler = [&](const RecordedMessage& inMessage) -> std::optional<std::intptr_t> {
-    if (inMessage.message != kStartInner) return std::nullopt;
-    if (inMessage.wParam == kNest) {
-      events.push_back("inner starts");
-      mLayer.PostMessage(mWindow, kStartInner, kQuit, 0);
-      const int code = mLayer.RunLoop();
-      events.push_back("inner ended " + std::to_string(code));
-      mLayer.QuitLoop(1);
-    } else if (inMessage.wParam == kQuit) {
-      mLayer.QuitLoop(2);
-    }
-    return 0;
-  };
-  mLayer.PostMessage(mWindow, kStartInner, kNest, 0);
-  const int outer = mLayer.RunLoop();
-  events.push_back("outer ended " + std::to_string(outer));
-  EXPECT_THAT(events, ElementsAre("inner starts", "inner ended 2", "outer ended 1"));
-}
-
 TEST_F(HeadlessLoopTest, TwoQuitsInOneHandlerEndTheInnerLoopAndThenTheOuter) {
   std::vector<int> codes;
   mHandler = [&](const RecordedMessage& inMessage) -> std::optional<std::intptr_t> {

@@ -24,30 +24,26 @@ TEST_F(NodeRectangles, IntegerRectEnclosesTheFloatRect) {
   EXPECT_EQ(v->UI_GetLocalRectF(true), RectF(1, 2, 3, 4));
 }
 
-TEST_F(NodeRectangles, SettingTheSameRectangleTwiceFiresNothingTheSecondTime) {
+TEST_F(NodeRectangles, ANewRectangleIsSeenBySizeCallbacksAndTheSameOneAgainFiresNothing) {
   auto v = MakeView(0, 0, 10, 10);
   int sizeChanges = 0;
-  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] { ++sizeChanges; }));
+  RectF seen;
+  UI_Node* raw = v.get();
+  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] {
+    ++sizeChanges;
+    seen = raw->UI_GetLocalRectF(true);
+  }));
   v->invalidations.clear();
   v->nodeChanges.clear();
   v->UI_SetLocalRectF(RectF(0, 0, 20, 10));
   EXPECT_EQ(sizeChanges, 1);
+  EXPECT_EQ(seen, RectF(0, 0, 20, 10));
   EXPECT_EQ(v->invalidations.size(), 2u);  // the old area, then the new one
   EXPECT_EQ(v->nodeChanges, std::vector<UI_Node::NodeChange>{UI_Node::kNodeChangeGeometry});
   v->UI_SetLocalRectF(RectF(0, 0, 20, 10));
   EXPECT_EQ(sizeChanges, 1);
   EXPECT_EQ(v->invalidations.size(), 2u);
   EXPECT_EQ(v->nodeChanges.size(), 1u);
-}
-
-TEST_F(NodeRectangles, SizeCallbacksSeeTheNewRectangle) {
-  auto v = MakeView(0, 0, 10, 10);
-  RectF seen;
-  UI_Node* raw = v.get();
-  v->InstallSizeChangedFunction(
-      boost::make_shared<boost::function<void()>>([&] { seen = raw->UI_GetLocalRectF(true); }));
-  v->UI_SetLocalRectF(RectF(1, 2, 30, 40));
-  EXPECT_EQ(seen, RectF(1, 2, 30, 40));
 }
 
 // ---------------------------------------------------------------------------
@@ -64,38 +60,36 @@ class LayoutBinding : public ManagerTest {
   RecordingViewP child;
 };
 
-TEST_F(LayoutBinding, TheFirstSizeMovesNoChildAndTheSecondDoes) {
-  child->UI_SetLayoutBinding(UI_SubView::kBindLeftMoves | UI_SubView::kBindTopMoves);
-  parent->UI_SetLocalRectF(RectF(0, 0, 100, 100));
-  EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(10, 10, 20, 20));
-  EXPECT_TRUE(parent->UI_GetViewFlags() & UI_SubView::kViewHasFirstSize);
-  parent->UI_SetLocalRectF(RectF(0, 0, 150, 120));
-  // Bit 1 and 2 alone move the edge and shrink by the same amount.
-  EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(60, 30, -30, 0));
-}
-
-TEST_F(LayoutBinding, MovingAndGrowingTogetherMovesWithoutResizing) {
-  child->UI_SetLayoutBinding(UI_SubView::kBindLeftMoves | UI_SubView::kBindWidthGrows |
-                             UI_SubView::kBindTopMoves | UI_SubView::kBindHeightGrows);
-  parent->UI_SetLocalRectF(RectF(0, 0, 100, 100));
-  parent->UI_SetLocalRectF(RectF(0, 0, 130, 90));
-  EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(40, 0, 20, 20));
-}
-
-TEST_F(LayoutBinding, GrowingBindingsFollowTheParentsSize) {
-  child->UI_SetLayoutBinding(UI_SubView::kBindWidthGrows | UI_SubView::kBindHeightGrows);
-  parent->UI_SetLocalRectF(RectF(0, 0, 100, 100));
-  parent->UI_SetLocalRectF(RectF(0, 0, 110, 125));
-  EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(10, 10, 30, 45));
-}
-
-TEST_F(LayoutBinding, CentringTruncatesAndTakesPrecedenceOverTheOtherBits) {
-  child->UI_SetLayoutBinding(UI_SubView::kBindCenterHorizontally | UI_SubView::kBindLeftMoves |
-                             UI_SubView::kBindCenterVertically | UI_SubView::kBindHeightGrows);
-  parent->UI_SetLocalRectF(RectF(0, 0, 100, 100));
-  parent->UI_SetLocalRectF(RectF(0, 0, 101, 51));
-  // (101-20)/2 = 40.5 -> 40; (51-20)/2 = 15.5 -> 15; sizes unchanged.
-  EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(40, 15, 20, 20));
+// Each row binds the child (10, 10, 20, 20), gives the parent its first
+// size, which moves nothing, and then a second one.
+TEST_F(LayoutBinding, TheSecondParentSizeMovesAndGrowsTheChildAsItsBindingSays) {
+  const struct {
+    const char* why;
+    unsigned binding;
+    RectF second, expected;
+  } rows[] = {
+      {"moving edges alone move and shrink by the same amount", UI_SubView::kBindLeftMoves | UI_SubView::kBindTopMoves,
+       RectF(0, 0, 150, 120), RectF(60, 30, -30, 0)},
+      {"moving and growing together move without resizing",
+       UI_SubView::kBindLeftMoves | UI_SubView::kBindWidthGrows | UI_SubView::kBindTopMoves |
+           UI_SubView::kBindHeightGrows,
+       RectF(0, 0, 130, 90), RectF(40, 0, 20, 20)},
+      {"growing follows the parent's size", UI_SubView::kBindWidthGrows | UI_SubView::kBindHeightGrows,
+       RectF(0, 0, 110, 125), RectF(10, 10, 30, 45)},
+      {"centring truncates and takes precedence",
+       UI_SubView::kBindCenterHorizontally | UI_SubView::kBindLeftMoves | UI_SubView::kBindCenterVertically |
+           UI_SubView::kBindHeightGrows,
+       RectF(0, 0, 101, 51), RectF(40, 15, 20, 20)},
+  };
+  for (const auto& row : rows) {
+    SetUp();
+    child->UI_SetLayoutBinding(row.binding);
+    parent->UI_SetLocalRectF(RectF(0, 0, 100, 100));
+    EXPECT_EQ(child->UI_GetLocalRectF(true), RectF(10, 10, 20, 20)) << row.why;
+    EXPECT_TRUE(parent->UI_GetViewFlags() & UI_SubView::kViewHasFirstSize);
+    parent->UI_SetLocalRectF(row.second);
+    EXPECT_EQ(child->UI_GetLocalRectF(true), row.expected) << row.why;
+  }
 }
 
 TEST_F(LayoutBinding, AViewThatDoesNotLayOutStillRemembersItsFirstSize) {
@@ -190,19 +184,21 @@ TEST_F(NodeMatrices, MappingIntoAViewScaledToNothingRaisesInsteadOfDividingByZer
 
 using NodeHitTests = ManagerTest;
 
-TEST_F(NodeHitTests, RightAndBottomEdgesAreOutside) {
+TEST_F(NodeHitTests, RightAndBottomEdgesAreOutsideAndAViewWithNoWidthIsNeitherShownNorHit) {
   auto v = MakeView(0, 0, 10, 20);
   EXPECT_TRUE(v->UI_HitTest(PointF(0, 0)));
   EXPECT_TRUE(v->UI_HitTest(PointF(9.99f, 19.99f)));
   EXPECT_FALSE(v->UI_HitTest(PointF(10, 5)));
   EXPECT_FALSE(v->UI_HitTest(PointF(5, 20)));
   EXPECT_FALSE(v->UI_HitTest(PointF(-0.01f, 5)));
-}
-
-TEST_F(NodeHitTests, AViewWithNoWidthIsNeitherShownNorHit) {
-  auto v = MakeView(0, 0, 0, 20);
-  EXPECT_FALSE(v->UI_IsShown());
-  EXPECT_FALSE(v->UI_HitTest(PointF(0, 0)));
+  auto flat = MakeView(0, 0, 0, 20);
+  EXPECT_FALSE(flat->UI_IsShown());
+  EXPECT_FALSE(flat->UI_HitTest(PointF(0, 0)));
+  auto root = MakeView(0, 0, 100, 100, nullptr, "root");
+  MakeView(0, 0, 10, 10, root.get(), "child");
+  PointF p(10, 5);
+  EXPECT_FALSE(root->GetChildHit(true, false, p).first) << "a child's far edge";
+  EXPECT_EQ(p, PointF(10, 5));
 }
 
 TEST_F(NodeHitTests, TheTopmostShownChildIsHitAndThePointIsMovedIntoIt) {
@@ -238,14 +234,6 @@ TEST_F(NodeHitTests, RecursiveHitReturnsTheDeepestNodeInItsOwnCoordinates) {
   hit = mid->GetChildHit(true, false, miss);
   EXPECT_FALSE(hit.first);
   EXPECT_EQ(miss, PointF(110, 110));
-}
-
-TEST_F(NodeHitTests, APointOnAChildsFarEdgeFallsThroughToTheParentOnly) {
-  auto root = MakeView(0, 0, 100, 100, nullptr, "root");
-  MakeView(0, 0, 10, 10, root.get(), "child");
-  PointF p(10, 5);
-  EXPECT_FALSE(root->GetChildHit(true, false, p).first);
-  EXPECT_EQ(p, PointF(10, 5));
 }
 
 }  // namespace

@@ -70,7 +70,7 @@ TEST_F(NodeTimerTest, ATimerLivesWhileItsNotificationAnswersTrue) {
   EXPECT_TRUE(mView->UI_GetTimerIDs().empty());
 }
 
-TEST_F(NodeTimerTest, ATimerWhoseNotificationAnswersFalseFiresOnce) {
+TEST_F(NodeTimerTest, ATimerEndsAtItsFirstFiringWhenNoNotificationAnswersTrue) {
   int calls = 0;
   mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++calls; return false; }));
   mView->UI_InstallTimer(0.1f, 7);
@@ -78,11 +78,9 @@ TEST_F(NodeTimerTest, ATimerWhoseNotificationAnswersFalseFiresOnce) {
   mWindow->UI_DispatchPossibleTimer(key);
   mWindow->UI_DispatchPossibleTimer(key);
   EXPECT_EQ(calls, 1);
-}
-
-TEST_F(NodeTimerTest, ANodeWithoutANotificationLosesItsTimerAtTheFirstFiring) {
-  mView->UI_InstallTimer(0.1f, 7);
-  EXPECT_TRUE(mWindow->UI_DispatchPossibleTimer(OnlyKey()));
+  FocusableViewP silent = AddView(*mWindow, "silent");
+  silent->UI_InstallTimer(0.1f, 8);
+  EXPECT_TRUE(mWindow->UI_DispatchPossibleTimer(silent->UI_GetTimerIDs().front())) << "no notification at all";
   EXPECT_EQ(mWindow->Timers().GetTimerCount(), 0u);
 }
 
@@ -176,28 +174,19 @@ class TimerCapture : public InputCapture {
   bool mTakes;
 };
 
-TEST_F(NodeTimerTest, ACaptureOnTheNodeSeesItsTimersFirst) {
-  int nodeCalls = 0;
-  mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++nodeCalls; return true; }));
-  mView->UI_InstallTimer(0.1f, 4);
-  boost::intrusive_ptr<TimerCapture> capture(new TimerCapture(mView.get(), true));
-  mManager.BeginInputCapture(capture);
-  EXPECT_TRUE(mWindow->UI_DispatchPossibleTimer(OnlyKey()));
-  EXPECT_EQ(capture->seen, (std::vector<long>{4}));
-  EXPECT_EQ(nodeCalls, 0);
-  mManager.EndInputCapture(false);
-}
-
-TEST_F(NodeTimerTest, ACaptureThatDeclinesLetsTheNodeHaveTheTimer) {
-  int nodeCalls = 0;
-  mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++nodeCalls; return true; }));
-  mView->UI_InstallTimer(0.1f, 4);
-  boost::intrusive_ptr<TimerCapture> capture(new TimerCapture(mView.get(), false));
-  mManager.BeginInputCapture(capture);
-  mWindow->UI_DispatchPossibleTimer(OnlyKey());
-  EXPECT_EQ(capture->seen.size(), 1u);
-  EXPECT_EQ(nodeCalls, 1);
-  mManager.EndInputCapture(false);
+TEST_F(NodeTimerTest, ACaptureOnTheNodeSeesItsTimersFirstAndMayLeaveThemToTheNode) {
+  for (bool takes : {true, false}) {
+    FocusableViewP view = AddView(*mWindow, takes ? "taken" : "declined");
+    int nodeCalls = 0;
+    view->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++nodeCalls; return true; }));
+    view->UI_InstallTimer(0.1f, 4);
+    boost::intrusive_ptr<TimerCapture> capture(new TimerCapture(view.get(), takes));
+    mManager.BeginInputCapture(capture);
+    EXPECT_TRUE(mWindow->UI_DispatchPossibleTimer(view->UI_GetTimerIDs().front()));
+    EXPECT_EQ(capture->seen, (std::vector<long>{4}));
+    EXPECT_EQ(nodeCalls, takes ? 0 : 1) << (takes ? "the capture takes it" : "the capture declines");
+    mManager.EndInputCapture(false);
+  }
 }
 
 TEST_F(NodeTimerTest, ACaptureOnAnotherNodeDoesNotSeeTheTimer) {
@@ -239,12 +228,15 @@ class ToolTipTimerTest : public NodeTimerTest {
   RecordingToolTipManager* mTips = nullptr;
 };
 
-TEST_F(ToolTipTimerTest, TheFirstFiringShowsTheTipAndEndsTheTimer) {
+TEST_F(ToolTipTimerTest, TheFirstFiringShowsTheTipAndEndsTheTimerWithoutTheNodesNotifications) {
+  int calls = 0;
+  mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++calls; return true; }));
   mView->UI_InstallTimer(0.5f, UI_NodeManager::GetTooltipTimerID());
   EXPECT_TRUE(mWindow->UI_DispatchPossibleTimer(OnlyKey()));
   EXPECT_EQ(mTips->calls, (std::vector<std::string>{"show"}));
   EXPECT_EQ(mTips->shown, mView.get());
   EXPECT_EQ(mWindow->Timers().GetTimerCount(), 0u);
+  EXPECT_EQ(calls, 0);
 }
 
 TEST_F(ToolTipTimerTest, AFiringWhileTheTipShowsTakesItDown) {
@@ -273,14 +265,6 @@ TEST_F(ToolTipTimerTest, TheMouseArrivingOnANodeWithATipShowsItOnlyWhenTheDelayR
   ASSERT_EQ(other->UI_GetTimerIDs().size(), 1u);
   mWindow->UI_DispatchPossibleTimer(other->UI_GetTimerIDs().front());
   EXPECT_EQ(mTips->shown, other.get());
-}
-
-TEST_F(ToolTipTimerTest, TheTipTimerNeverReachesTheNodesNotifications) {
-  int calls = 0;
-  mView->UI_InstallTimerNotifyFunction(TimerNotification([&](long) { ++calls; return true; }));
-  mView->UI_InstallTimer(0.5f, UI_NodeManager::GetTooltipTimerID());
-  mWindow->UI_DispatchPossibleTimer(OnlyKey());
-  EXPECT_EQ(calls, 0);
 }
 
 }  // namespace
