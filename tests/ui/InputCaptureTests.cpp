@@ -6,25 +6,14 @@
 #include <gtest/gtest.h>
 
 #include "support/ui/DispatchTestNodes.h"
+#include "support/ui/NodeTestSupport.h"
 #include "ui/UI_SuspendToolTips.h"
-#include "ui/UI_ToolTipManager.h"
 
 namespace norvik::ui::test {
 namespace {
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
-
-class CountingToolTips : public UI_ToolTipManager {
- public:
-  explicit CountingToolTips(int* ioDisposals) : mDisposals(ioDisposals) {}
-  UI_Node* GetToolTipNode() const override { return nullptr; }
-  void RefreshToolTip(UI_Node*) override {}
-  void DisposeToolTip() override { ++*mDisposals; }
-
- private:
-  int* mDisposals;
-};
 
 class InputCaptureTest : public DispatchTest {
  protected:
@@ -142,12 +131,11 @@ TEST_F(InputCaptureTest, ThePreviousEventIsTheLastRealOneNotAHoverUpdate) {
 }
 
 TEST_F(InputCaptureTest, ToolTipsAreSuspendedFromBeginToEnd) {
-  int disposals = 0;
-  manager.SetToolTipManager(std::make_unique<CountingToolTips>(&disposals));
+  RecordingToolTips* tips = RecordingToolTips::InstallIn(manager);
   EXPECT_FALSE(UI_SuspendToolTips::IsSuspended());
   StartDrag();
   EXPECT_TRUE(UI_SuspendToolTips::IsSuspended());
-  EXPECT_EQ(disposals, 1) << "the tip on screen goes away";
+  EXPECT_EQ(tips->calls, std::vector<std::string>{"dispose"}) << "the tip on screen goes away";
   manager.EndInputCapture(false);
   EXPECT_FALSE(UI_SuspendToolTips::IsSuspended());
 }

@@ -2,7 +2,10 @@
 // the leaf's coordinates, after the first-chance passes; a filter that claims
 // the event keeps it from the leaf and its ancestors. The pass works on a
 // copy of the list, so filters may remove themselves or each other.
+#include <functional>
+
 #include <boost/make_shared.hpp>
+
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
@@ -28,35 +31,54 @@ class MouseFilterTest : public DispatchTest {
   EventViewP panel, button, popup, other;
 };
 
-TEST_F(MouseFilterTest, AFilterSeesTheEventOnceAtTheLeafInTheLeafsCoordinates) {
-  manager.AddMouseEventFilterNode(popup.get());
-  Click(PointF(35, 36));
-  EXPECT_THAT(log.Texts(), ElementsAre("popup.pre(button)", "button.mouse(button)", "panel.mouse(button)",
-                                       "root.mouse(button)"));
-  EXPECT_EQ(log.Find("popup", "pre").position, PointF(5, 6));
-}
-
-TEST_F(MouseFilterTest, AClaimingFilterHidesTheEventFromTheLeafAndItsAncestorsButNotFromFirstChanceNodes) {
-  panel->UI_SetStateFlags(panel->UI_GetStateFlags().Set(UI_Node::kStateFirstChanceMouse));
-  popup->handlesPreMouse = true;
-  manager.AddMouseEventFilterNode(popup.get());
-  EXPECT_TRUE(Click(PointF(35, 35)));
-  EXPECT_THAT(log.Texts(), ElementsAre("panel.mouse(-)", "popup.pre(button)"));
-}
-
-TEST_F(MouseFilterTest, FiltersRunNewestFirstAndTheFirstClaimEndsThePass) {
-  manager.AddMouseEventFilterNode(other.get());
-  manager.AddMouseEventFilterNode(popup.get());
-  popup->handlesPreMouse = true;
-  Click(PointF(35, 35));
-  EXPECT_THAT(log.Texts(), ElementsAre("popup.pre(button)"));
-}
-
-TEST_F(MouseFilterTest, FiltersStillRunForADisabledLeafWhichItselfSeesNothing) {
-  button->UI_SetSelfDisabled(true);
-  manager.AddMouseEventFilterNode(popup.get());
-  Click(PointF(35, 35));
-  EXPECT_THAT(log.Texts(), ElementsAre("popup.pre(button)", "panel.mouse(button)", "root.mouse(button)"));
+// Each row sets up filters on a fresh tree and clicks the button; the log
+// lists every node that saw the click, in order.
+TEST_F(MouseFilterTest, FiltersSeeTheClickFirstNewestFirstAndAClaimHidesItFromAllButFirstChanceNodes) {
+  struct Row {
+    const char* name;
+    std::function<void()> setUp;
+    bool claimed;
+    std::vector<std::string> seen;
+  };
+  const Row rows[] = {
+      {"one filter", [this] { manager.AddMouseEventFilterNode(popup.get()); }, false,
+       {"popup.pre(button)", "button.mouse(button)", "panel.mouse(button)", "root.mouse(button)"}},
+      {"a claiming filter and a first-chance panel",
+       [this] {
+         panel->UI_SetStateFlags(panel->UI_GetStateFlags().Set(UI_Node::kStateFirstChanceMouse));
+         popup->handlesPreMouse = true;
+         manager.AddMouseEventFilterNode(popup.get());
+       },
+       true, {"panel.mouse(-)", "popup.pre(button)"}},
+      {"the newer filter claims",
+       [this] {
+         manager.AddMouseEventFilterNode(other.get());
+         manager.AddMouseEventFilterNode(popup.get());
+         popup->handlesPreMouse = true;
+       },
+       true, {"popup.pre(button)"}},
+      {"a disabled leaf",
+       [this] {
+         button->UI_SetSelfDisabled(true);
+         manager.AddMouseEventFilterNode(popup.get());
+       },
+       false, {"popup.pre(button)", "panel.mouse(button)", "root.mouse(button)"}},
+  };
+  for (const Row& row : rows) {
+    SCOPED_TRACE(row.name);
+    root->DeleteChildren();
+    panel = View("panel", 20, 20, 100, 100, root.get());
+    button = View("button", 10, 10, 30, 30, panel.get());
+    popup = View("popup", 150, 150, 40, 40, root.get());
+    other = View("other", 0, 0, 10, 10, nullptr);
+    row.setUp();
+    log.Clear();
+    EXPECT_EQ(Click(PointF(35, 36)), row.claimed);
+    EXPECT_EQ(log.Texts(), row.seen);
+    EXPECT_EQ(log.Find("popup", "pre").position, PointF(5, 6)) << "in the leaf's coordinates";
+    manager.RemoveMouseEventFilterNode(popup.get());
+    manager.RemoveMouseEventFilterNode(other.get());
+  }
 }
 
 TEST_F(MouseFilterTest, AFilterThatRemovesItselfLeavesTheOthersInThePass) {
@@ -117,14 +139,6 @@ TEST_F(MouseFilterTest, ACustomPreMouseFunctionCanAnswerForTheFilter) {
   EXPECT_FALSE(Click(PointF(35, 35)));
   EXPECT_THAT(log.Texts(), ElementsAre("popup.pre(button)", "button.mouse(button)", "panel.mouse(button)",
                                        "root.mouse(button)"));
-}
-
-TEST_F(MouseFilterTest, AClaimFromACustomFunctionThatDidNotTakeOverDoesNotCount) {
-  manager.AddMouseEventFilterNode(popup.get());
-  popup->UI_SetCustomPreMouseEventFunction(boost::make_shared<boost::function<bool(UI_Node*, const MouseEvent&, bool&)>>(
-      [](UI_Node*, const MouseEvent&, bool&) { return true; }));
-  EXPECT_FALSE(Click(PointF(35, 35)));
-  EXPECT_EQ(log.Texts("mouse").size(), 3u);
 }
 
 }  // namespace

@@ -360,23 +360,8 @@ TEST_F(ManagerSeams, EditTextCreationUsesTheInstalledHookAlone) {
   EXPECT_EQ(host->UI_GetParentNode(), parent.get());
 }
 
-class FakeTips : public UI_ToolTipManager {
- public:
-  UI_Node* GetToolTipNode() const override { return shown; }
-  void RefreshToolTip(UI_Node* inNode) override { refreshed.push_back(inNode); }
-  void DisposeToolTip() override {
-    shown = nullptr;
-    ++disposed;
-  }
-  UI_Node* shown = nullptr;
-  std::vector<UI_Node*> refreshed;
-  int disposed = 0;
-};
-
 TEST_F(ManagerSeams, ChangingTheTipOfTheDisplayedNodeRefreshesOrDisposesIt) {
-  auto tips = std::make_unique<FakeTips>();
-  FakeTips* t = tips.get();
-  manager.SetToolTipManager(std::move(tips));
+  RecordingToolTips* t = RecordingToolTips::InstallIn(manager);
   auto v = MakeView(0, 0, 10, 10);
   v->UI_SetToolTip(u"first", 100);
   EXPECT_TRUE(t->refreshed.empty());  // not on screen, not under the mouse
@@ -387,18 +372,16 @@ TEST_F(ManagerSeams, ChangingTheTipOfTheDisplayedNodeRefreshesOrDisposesIt) {
   v->UI_SetToolTip(u"second", 300);
   EXPECT_EQ(v->UI_GetToolTipWidth(), 120);  // same text: the width is not taken either
   v->UI_SetToolTip(u"", 0);
-  EXPECT_EQ(t->disposed, 1);
+  EXPECT_EQ(t->calls, (std::vector<std::string>{"show", "dispose"}));
 }
 
 TEST_F(ManagerSeams, TheTipOfTheMouseOverLeafIsDisposedWhenTheLeafIsDestroyed) {
-  auto tips = std::make_unique<FakeTips>();
-  FakeTips* t = tips.get();
-  manager.SetToolTipManager(std::move(tips));
+  RecordingToolTips* t = RecordingToolTips::InstallIn(manager);
   auto v = MakeView(0, 0, 10, 10);
   t->shown = v.get();
   manager.SetMouseOverLeafNode(v.get());
   v.reset();
-  EXPECT_EQ(t->disposed, 1);
+  EXPECT_EQ(t->calls, std::vector<std::string>{"dispose"});
   EXPECT_EQ(t->shown, nullptr);
 }
 

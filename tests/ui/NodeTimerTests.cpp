@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include "support/ui/FocusTestNodes.h"
+#include "support/ui/NodeTestSupport.h"
 #include "ui/InputCapture.h"
 #include "ui/MessageT.h"
 #include "ui/UI_NodeManager.h"
@@ -201,31 +202,14 @@ TEST_F(NodeTimerTest, ACaptureOnAnotherNodeDoesNotSeeTheTimer) {
 
 // ---------------------------------------------------------------- tool tips
 
-class RecordingToolTipManager : public UI_ToolTipManager {
- public:
-  UI_Node* GetToolTipNode() const override { return shown; }
-  void RefreshToolTip(UI_Node* inNode) override {
-    shown = inNode;
-    calls.push_back("show");
-  }
-  void DisposeToolTip() override {
-    shown = nullptr;
-    calls.push_back("dispose");
-  }
-  UI_Node* shown = nullptr;
-  std::vector<std::string> calls;
-};
-
 class ToolTipTimerTest : public NodeTimerTest {
  protected:
   ToolTipTimerTest() {
-    auto tips = std::make_unique<RecordingToolTipManager>();
-    mTips = tips.get();
-    mManager.SetToolTipManager(std::move(tips));
+    mTips = test::RecordingToolTips::InstallIn(mManager);
     mView->UI_SetToolTip(u"Gain", 0);
     mManager.SetMouseOverLeafNode(mView.get());
   }
-  RecordingToolTipManager* mTips = nullptr;
+  test::RecordingToolTips* mTips = nullptr;
 };
 
 TEST_F(ToolTipTimerTest, TheFirstFiringShowsTheTipAndEndsTheTimerWithoutTheNodesNotifications) {

@@ -4,7 +4,6 @@
 #include <gmock/gmock.h>
 
 #include "support/ui/NativeWindowTestSupport.h"
-#include "ui/OS_OpenGLViewBase.h"
 #include "ui/OS_PopupWindow.h"
 #include "ui/Theme.h"
 
@@ -16,26 +15,6 @@ using ViewContainerTest = NativeWindowTest;
 std::uint32_t Opaque(float inRed, float inGreen, float inBlue) {
   auto channel = [](float v) { return static_cast<std::uint32_t>(v * 255.0f + 0.5f); };
   return 0xFF000000u | (channel(inRed) << 16) | (channel(inGreen) << 8) | channel(inBlue);
-}
-
-TEST_F(ViewContainerTest, APaintedWindowShowsItsViewsPixels) {
-  auto window = MakeTopLevel(OS_Rect(0, 0, 120, 80));
-  auto back = AddView(window.get(), "back", 0, 0, 120, 80);
-  back->paints = true;
-  back->blue = 1.0f;
-  auto red = AddView(back.get(), "red", 20, 10, 30, 40);
-  red->paints = true;
-  red->red = 1.0f;
-  window->UI_Invalidate(nullptr, 0);
-  mSystem.Pump();
-
-  const HeadlessPixels pixels = mSystem.ReadWindowPixels(window->GetHandle());
-  ASSERT_EQ(pixels.width, 120);
-  ASSERT_EQ(pixels.height, 80);
-  EXPECT_EQ(pixels.At(25, 15), Opaque(1, 0, 0));
-  EXPECT_EQ(pixels.At(49, 49), Opaque(1, 0, 0));
-  EXPECT_EQ(pixels.At(50, 50), Opaque(0, 0, 1));
-  EXPECT_EQ(pixels.At(5, 5), Opaque(0, 0, 1));
 }
 
 TEST_F(ViewContainerTest, InvalidatingAViewRepaintsItWithItsNewColour) {
@@ -73,22 +52,6 @@ TEST_F(ViewContainerTest, ARectangleSetBeforeTheContainerHadAParentIsAppliedAgai
   EXPECT_EQ(mLayer.GetStyle(handle) & kOSStylePopup, 0u);
   // The enclosing integer rectangle, now in the parent's client coordinates.
   EXPECT_EQ(mLayer.GetWindowRect(handle), OS_Rect(110, 120, 51, 40));
-}
-
-TEST_F(ViewContainerTest, AContainerTakenFromItsParentHidesAndShowsAgainUnderTheNext) {
-  auto first = MakeTopLevel(OS_Rect(0, 0, 200, 200));
-  auto second = MakeTopLevel(OS_Rect(300, 0, 200, 200));
-  OS_ViewContainerP container(new OS_ViewContainer(false));
-  container->UI_SetLocalRect(UI_Node::RectL(5, 5, 20, 20));
-  first->ChildPushBack(container);
-  container->UI_Show(true);
-  ASSERT_TRUE(container->UI_IsShown());
-  first->ChildRemove(container.get());
-  EXPECT_FALSE(container->UI_IsShown());
-  second->ChildPushBack(container);
-  EXPECT_TRUE(container->UI_IsShown());
-  EXPECT_EQ(mLayer.GetParent(container->GetHandle()), second->GetHandle());
-  EXPECT_EQ(mLayer.GetWindowRect(container->GetHandle()), OS_Rect(305, 5, 20, 20));
 }
 
 TEST_F(ViewContainerTest, AViewInANestedContainerReceivesClicksInItsOwnCoordinates) {
@@ -134,47 +97,6 @@ TEST_F(ViewContainerTest, APopupWindowIsTopmostAndNeverActivates) {
   EXPECT_NE(mLayer.GetExStyle(handle) & kOSExStyleTopmost, 0u);
   EXPECT_NE(mLayer.GetExStyle(handle) & kOSExStyleNoActivate, 0u);
   EXPECT_EQ(popup.UI_GetNodeID(), "OS_PopupWindow");
-}
-
-}  // namespace
-}  // namespace norvik::ui::test
-
-namespace norvik::ui::test {
-namespace {
-
-// Counts the context's life and the drawing steps, in order.
-class CountingGLView : public OS_OpenGLViewBase {
- public:
-  void InitOpenGL() override { log.push_back("init"); }
-  void EndOpenGL() override { log.push_back("end"); }
-  void PreDrawOpenGL() override { log.push_back("pre"); }
-  void DrawOpenGL() override { log.push_back("draw"); }
-  void PostDrawOpenGL() override { log.push_back("post"); }
-  std::vector<std::string> log;
-};
-
-TEST_F(ViewContainerTest, TheGLContextIsRebuiltAcrossAReparentAndEndedWhenTakenAway) {
-  auto first = MakeTopLevel(OS_Rect(0, 0, 100, 100));
-  auto second = MakeTopLevel(OS_Rect(200, 0, 100, 100));
-  boost::intrusive_ptr<CountingGLView> gl(new CountingGLView);
-  first->ChildPushBack(gl);
-  EXPECT_THAT(gl->log, ::testing::ElementsAre("end", "init"));
-  gl->log.clear();
-  first->ChildRemove(gl.get());
-  second->ChildPushBack(gl);
-  EXPECT_THAT(gl->log, ::testing::ElementsAre("end", "end", "init"));
-}
-
-TEST_F(ViewContainerTest, AGLViewPaintMakesItsContextCurrentDrawsAndPresents) {
-  auto top = MakeTopLevel(OS_Rect(0, 0, 100, 100));
-  boost::intrusive_ptr<CountingGLView> gl(new CountingGLView);
-  gl->UI_SetLocalRect(UI_Node::RectL(0, 0, 50, 50));
-  top->ChildPushBack(gl);
-  gl->UI_Show(true);
-  gl->log.clear();
-  gl->UI_Invalidate(nullptr, 0);
-  mSystem.Pump();
-  EXPECT_THAT(gl->log, ::testing::ElementsAre("pre", "draw", "post"));
 }
 
 }  // namespace

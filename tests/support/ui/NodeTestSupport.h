@@ -2,6 +2,7 @@
 // Doubles for node-tree tests: a view that records what the tree tells it,
 // and a fixture that owns the process-wide manager.
 #include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -10,6 +11,7 @@
 
 #include "ui/OS_NodeManager.h"
 #include "ui/UI_SubView.h"
+#include "ui/UI_ToolTipManager.h"
 
 namespace norvik::ui::test {
 
@@ -59,6 +61,32 @@ inline RecordingViewP MakeView(float inX, float inY, float inW, float inH, UI_No
   if (inParent) inParent->ChildPushBack(v);
   return v;
 }
+
+// A tool tip manager that records each tip it was asked to show ("show",
+// with the node in refreshed) and each dispose.
+class RecordingToolTips : public UI_ToolTipManager {
+ public:
+  UI_Node* GetToolTipNode() const override { return shown; }
+  void RefreshToolTip(UI_Node* inNode) override {
+    shown = inNode;
+    refreshed.push_back(inNode);
+    calls.push_back("show");
+  }
+  void DisposeToolTip() override {
+    shown = nullptr;
+    calls.push_back("dispose");
+  }
+  // Installs a new one in inManager, which owns it.
+  static RecordingToolTips* InstallIn(UI_NodeManager& inManager) {
+    auto tips = std::make_unique<RecordingToolTips>();
+    RecordingToolTips* raw = tips.get();
+    inManager.SetToolTipManager(std::move(tips));
+    return raw;
+  }
+  UI_Node* shown = nullptr;
+  std::vector<UI_Node*> refreshed;
+  std::vector<std::string> calls;
+};
 
 // Owns the manager for the length of one test.
 class ManagerTest : public ::testing::Test {
