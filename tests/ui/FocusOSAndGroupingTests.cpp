@@ -86,46 +86,41 @@ TEST_F(FocusOSTest, FocusMessagesWhileFocusIsBeingUpdatedAreIgnored) {
 
 // ---------------------------------------------------------------- kill focus
 
-TEST_F(FocusOSTest, KillFocusToAWindowOutsideLosesFocus) {
-  FocusableViewP field = AddView(*mWindow, "field", &mLog);
-  field->UI_GainKeyboardFocus(kFocusChangeMouse);
-  mLog.clear();
-  mPlatform.mWindows[999] = {nullptr, false, 0};  // someone else's top level
-  UI_Node::UI_OSKillFocus(mWindow.get(), 999);
-  EXPECT_EQ(FocusLeafID(), "");
-  EXPECT_EQ(mManager.GetPreviousKeyboardFocusLeafNode(), field.get());
-  EXPECT_FALSE(field->UI_HasKeyboardFocus(false));
-  EXPECT_FALSE(mWindow->UI_HasKeyboardFocus(false));
-  EXPECT_EQ(mLog, (FocusLog{{"window", kFocusChangeLoss, false}, {"field", kFocusChangeLoss, false}}));
-}
-
-TEST_F(FocusOSTest, KillFocusToOneOfOurWindowsHandsFocusOver) {
-  FocusableViewP field = AddView(*mWindow, "field", &mLog);
-  field->UI_GainKeyboardFocus(kFocusChangeMouse);
-  mLog.clear();
-  UI_Node::UI_OSKillFocus(mWindow.get(), kOtherHandle);
-  EXPECT_EQ(FocusLeafID(), "other");
-  EXPECT_FALSE(field->UI_HasKeyboardFocus(false));
-  ASSERT_FALSE(mLog.empty());
-  EXPECT_EQ(mLog.back(), (test::FocusEvent{"other", kFocusChangeHandOver, true}));
-  // The platform already knows; it is not told again.
-  EXPECT_EQ(mOther->mOSSetFocusCalls, 0);
-}
-
-TEST_F(FocusOSTest, KillFocusToAForeignChildInsideOurWindowClimbsToOurWindow) {
-  mWindow->UI_GainKeyboardFocus(kFocusChangeMouse);
-  mPlatform.mWindows[300] = {nullptr, true, 301};        // a foreign child ...
-  mPlatform.mWindows[301] = {nullptr, true, kOtherHandle};  // ... in a foreign child of ours
-  UI_Node::UI_OSKillFocus(mWindow.get(), 300);
-  EXPECT_EQ(FocusLeafID(), "other");
-}
-
-TEST_F(FocusOSTest, KillFocusToAChildWhoseTopLevelIsForeignLosesFocus) {
-  mWindow->UI_GainKeyboardFocus(kFocusChangeMouse);
-  mPlatform.mWindows[300] = {nullptr, true, 301};
-  mPlatform.mWindows[301] = {nullptr, false, 0};
-  UI_Node::UI_OSKillFocus(mWindow.get(), 300);
-  EXPECT_EQ(FocusLeafID(), "");
+// Each row loses the window's focus to another native window: one of ours
+// (directly, or through foreign children) takes it over; anything else loses it.
+TEST_F(FocusOSTest, KillFocusHandsFocusToOurWindowThatGetsItOrElseLosesIt) {
+  mPlatform.mWindows[999] = {nullptr, false, 0};             // someone else's top level
+  mPlatform.mWindows[300] = {nullptr, true, 301};            // a foreign child ...
+  mPlatform.mWindows[301] = {nullptr, true, kOtherHandle};   // ... in a foreign child of ours
+  mPlatform.mWindows[400] = {nullptr, true, 401};            // a child ...
+  mPlatform.mWindows[401] = {nullptr, false, 0};             // ... of a foreign top level
+  const struct {
+    OS_WindowHandle to;
+    test::FocusEvent last;
+  } rows[] = {
+      {999, {"field", kFocusChangeLoss, false}},
+      {kOtherHandle, {"other", kFocusChangeHandOver, true}},
+      {300, {"other", kFocusChangeHandOver, true}},
+      {400, {"field", kFocusChangeLoss, false}},
+  };
+  for (const auto& row : rows) {
+    SCOPED_TRACE(row.to);
+    mWindow->DeleteChildren();
+    FocusableViewP field = AddView(*mWindow, "field", &mLog);
+    field->UI_GainKeyboardFocus(kFocusChangeMouse);
+    mLog.clear();
+    UI_Node::UI_OSKillFocus(mWindow.get(), row.to);
+    const bool lost = row.last.reason == kFocusChangeLoss;
+    EXPECT_EQ(FocusLeafID(), lost ? "" : "other");
+    EXPECT_FALSE(field->UI_HasKeyboardFocus(false));
+    EXPECT_FALSE(mWindow->UI_HasKeyboardFocus(false));
+    ASSERT_FALSE(mLog.empty());
+    EXPECT_EQ(mLog.back(), row.last);
+    if (lost) {
+      EXPECT_EQ(mManager.GetPreviousKeyboardFocusLeafNode(), field.get());
+    }
+  }
+  EXPECT_EQ(mOther->mOSSetFocusCalls, 0) << "the platform already knows; it is not told again";
 }
 
 TEST_F(FocusOSTest, WithoutAFocusPlatformKillFocusIsALoss) {
@@ -137,13 +132,17 @@ TEST_F(FocusOSTest, WithoutAFocusPlatformKillFocusIsALoss) {
 
 // ---------------------------------------------------------------- grouping
 
-TEST_F(FocusOSTest, WhileGroupingFocusMovesTheLeafButNoFlagAndNobodyIsTold) {
+TEST_F(FocusOSTest, GroupingTakesFocusOutOfTheTreeAndThenMovesTheLeafButNoFlagTellingNobody) {
   FocusableViewP a = AddView(*mWindow, "a", &mLog);
   FocusableViewP b = AddView(*mWindow, "b", &mLog);
   a->UI_GainKeyboardFocus(kFocusChangeMouse);
+  mLog.clear();
   {
     UI_NodeManager::GroupingFocusChanges group(&mManager, false);
     EXPECT_TRUE(mManager.IsGroupingFocusChanges());
+    EXPECT_EQ(FocusLeafID(), "");
+    EXPECT_FALSE(a->UI_HasKeyboardFocus(false));
+    EXPECT_EQ(mLog, (FocusLog{{"window", kFocusChangeLoss, false}, {"a", kFocusChangeLoss, false}}));
     mLog.clear();
     EXPECT_TRUE(b->UI_GainKeyboardFocus(kFocusChangeMouse));
     EXPECT_EQ(FocusLeafID(), "b");
@@ -159,17 +158,7 @@ TEST_F(FocusOSTest, WhileGroupingFocusMovesTheLeafButNoFlagAndNobodyIsTold) {
   EXPECT_EQ(mLog, (FocusLog{{"window", kFocusChangeRestore, true}, {"b", kFocusChangeRestore, true}}));
 }
 
-TEST_F(FocusOSTest, GroupingTakesFocusOutOfTheTreeFirst) {
-  FocusableViewP a = AddView(*mWindow, "a", &mLog);
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
-  mLog.clear();
-  UI_NodeManager::GroupingFocusChanges group(&mManager, false);
-  EXPECT_EQ(FocusLeafID(), "");
-  EXPECT_FALSE(a->UI_HasKeyboardFocus(false));
-  EXPECT_EQ(mLog, (FocusLog{{"window", kFocusChangeLoss, false}, {"a", kFocusChangeLoss, false}}));
-}
-
-TEST_F(FocusOSTest, GroupingWithRestoreReturnsFocusToTheStartingLeaf) {
+TEST_F(FocusOSTest, GroupingWithRestoreReturnsFocusToTheStartingLeafOrIfHiddenKeepsTheLast) {
   FocusableViewP a = AddView(*mWindow, "a", &mLog);
   FocusableViewP b = AddView(*mWindow, "b", &mLog);
   a->UI_GainKeyboardFocus(kFocusChangeMouse);
@@ -180,12 +169,6 @@ TEST_F(FocusOSTest, GroupingWithRestoreReturnsFocusToTheStartingLeaf) {
   EXPECT_EQ(FocusLeafID(), "a");
   EXPECT_TRUE(a->UI_HasKeyboardFocus(true));
   EXPECT_FALSE(b->UI_HasKeyboardFocus(false));
-}
-
-TEST_F(FocusOSTest, GroupingRestoresTheLastLeafWhenTheStartingOneIsHidden) {
-  FocusableViewP a = AddView(*mWindow, "a", &mLog);
-  FocusableViewP b = AddView(*mWindow, "b", &mLog);
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
   {
     UI_NodeManager::GroupingFocusChanges group(&mManager, true);
     b->UI_GainKeyboardFocus(kFocusChangeMouse);

@@ -328,16 +328,6 @@ TEST_F(HeadlessWindowTest, ActivationBetweenApplicationsTellsBoth) {
   EXPECT_EQ(Messages(kOSMsgActivateApp)[0].window, theirs);
 }
 
-TEST_F(HeadlessWindowTest, AWindowThatMustNotActivateNeverDoes) {
-  const OS_WindowHandle main = MakeWindow(OS_Rect(0, 0, 10, 10));
-  const OS_WindowHandle tip = MakeWindow(OS_Rect(0, 0, 10, 10), kOSStyleVisible | kOSStylePopup, kOSExStyleNoActivate);
-  EXPECT_EQ(mLayer.GetActiveWindow(), main);
-  mLayer.SetActiveWindow(tip);
-  mLayer.SetForegroundWindow(tip);
-  EXPECT_EQ(mLayer.GetActiveWindow(), main);
-  EXPECT_TRUE(Messages(kOSMsgActivate, tip).empty());
-}
-
 TEST_F(HeadlessWindowTest, HidingTheActiveWindowActivatesItsOwnerOrTheNextWindow) {
   const OS_WindowHandle back = MakeWindow(OS_Rect(0, 0, 10, 10));
   const OS_WindowHandle owner = MakeWindow(OS_Rect(0, 0, 10, 10));
@@ -404,35 +394,6 @@ TEST_F(HeadlessWindowTest, DestroyingTheFocusAndCaptureWindowClearsBoth) {
 }
 
 // ---- monitors, preferences, cursors ----
-
-TEST_F(HeadlessWindowTest, MonitorsPreferencesAndCursorsAreThoseConfigured) {
-  ASSERT_EQ(mLayer.GetMonitors().size(), 1u);
-  OS_Monitor only{OS_Rect(0, 0, 640, 480), OS_Rect(0, 20, 640, 460)};
-  mSystem.SetMonitors({only});
-  EXPECT_EQ(mLayer.GetMonitors()[0].workArea, OS_Rect(0, 20, 640, 460));
-
-  bool value = true;
-  EXPECT_FALSE(mLayer.GetPreference("windows.MnemonicsAlwaysOn", value));
-  mSystem.SetPreference("windows.MnemonicsAlwaysOn", false);
-  EXPECT_TRUE(mLayer.GetPreference("windows.MnemonicsAlwaysOn", value));
-  EXPECT_FALSE(value);
-
-  const std::uint32_t pixels[4] = {0xFF000000, 0xFFFFFFFF, 0xFFFFFFFF, 0xFF000000};
-  const OS_CursorHandle custom = mLayer.CreateCursorFromPixels(pixels, 2, 2, 1, 0);
-  ASSERT_NE(custom, 0u);
-  EXPECT_NE(custom, mLayer.LoadSystemCursor(kOSCursorIBeam));
-  mLayer.SetCursor(custom);
-  EXPECT_EQ(mLayer.GetCursor(), custom);
-  std::vector<std::uint32_t> readBack;
-  OS_Point size, hotSpot;
-  ASSERT_TRUE(mSystem.GetCursorImage(custom, readBack, size, hotSpot));
-  EXPECT_EQ(readBack[1], 0xFFFFFFFFu);
-  EXPECT_EQ(hotSpot.x, 1);
-  mLayer.DestroyCursor(custom);
-  EXPECT_FALSE(mSystem.GetCursorImage(custom, readBack, size, hotSpot));
-  EXPECT_EQ(mLayer.GetDoubleClickTime(), 500u);
-  EXPECT_EQ(mLayer.GetDoubleClickSize().x, 4);
-}
 
 TEST_F(HeadlessWindowTest, CaretAndOpacityAreRecorded) {
   const OS_WindowHandle window = MakeWindow(OS_Rect(0, 0, 10, 10), kOSStyleVisible, kOSExStyleLayered);

@@ -18,60 +18,34 @@ std::vector<int> DownClickCounts(const InputRecorderView& inView) {
   return counts;
 }
 
-TEST_F(NativeWindowMouseTest, AClickBecomesAButtonPressAndReleaseOnTheNodeUnderThePointer) {
+TEST_F(NativeWindowMouseTest, ClicksReachTheNodeUnderThePointerWithTheirButtonCountingPastTwoUntilTheTimeIsUp) {
   auto window = MakeTopLevel(OS_Rect(100, 100, 300, 200));
   auto left = AddView(window.get(), "left", 0, 0, 100, 100);
   auto right = AddView(window.get(), "right", 150, 50, 100, 100);
-  mSystem.Click(OS_Point(100 + 160, 100 + 65), kHeadlessButtonLeft);
+  for (int i = 0; i < 4; ++i) {
+    mSystem.Click(OS_Point(100 + 160, 100 + 65), kHeadlessButtonLeft);
+    mSystem.AdvanceClock(50);
+  }
+  mSystem.AdvanceClock(mLayer.GetDoubleClickTime() + 100);
+  mSystem.Click(OS_Point(100 + 160, 100 + 65));
+  mSystem.AdvanceClock(2000);
+  mSystem.Click(OS_Point(100 + 160, 100 + 65), kHeadlessButtonRight);
+  mSystem.AdvanceClock(2000);
+  mSystem.Click(OS_Point(100 + 160, 100 + 65), kHeadlessButtonMiddle);
   mSystem.Pump();
 
   EXPECT_TRUE(left->mouse.empty());
+  EXPECT_THAT(DownClickCounts(*right), ::testing::ElementsAre(1, 2, 3, 4, 1, 1, 1));
   const auto downs = right->Actions(MouseEvent::kActionButtonDown);
   const auto ups = right->Actions(MouseEvent::kActionButtonUp);
-  ASSERT_EQ(downs.size(), 1u);
-  ASSERT_EQ(ups.size(), 1u);
+  ASSERT_EQ(downs.size(), 7u);
+  ASSERT_EQ(ups.size(), 7u);
   EXPECT_EQ(downs[0].GetButton(), MouseEvent::kButtonLeft);
-  EXPECT_EQ(downs[0].GetClickCount(), 1);
   EXPECT_FLOAT_EQ(downs[0].GetPosition().x, 10.0f);
   EXPECT_FLOAT_EQ(downs[0].GetPosition().y, 15.0f);
   EXPECT_EQ(ups[0].GetButton(), MouseEvent::kButtonLeft);
-}
-
-TEST_F(NativeWindowMouseTest, RightAndMiddleButtonsKeepTheirNumbers) {
-  auto window = MakeTopLevel(OS_Rect(0, 0, 200, 200));
-  auto view = AddView(window.get(), "view", 0, 0, 200, 200);
-  mSystem.Click(OS_Point(20, 20), kHeadlessButtonRight);
-  mSystem.AdvanceClock(2000);
-  mSystem.Click(OS_Point(20, 20), kHeadlessButtonMiddle);
-  mSystem.Pump();
-  const auto downs = view->Actions(MouseEvent::kActionButtonDown);
-  ASSERT_EQ(downs.size(), 2u);
-  EXPECT_EQ(downs[0].GetButton(), MouseEvent::kButtonRight);
-  EXPECT_EQ(downs[1].GetButton(), MouseEvent::kButtonMiddle);
-  EXPECT_EQ(view->Actions(MouseEvent::kActionButtonUp).size(), 2u);
-}
-
-TEST_F(NativeWindowMouseTest, AThirdQuickClickCountsThreeAndAFourthFour) {
-  auto window = MakeTopLevel(OS_Rect(0, 0, 200, 200));
-  auto view = AddView(window.get(), "view", 0, 0, 200, 200);
-  for (int i = 0; i < 4; ++i) {
-    mSystem.Click(OS_Point(50, 50));
-    mSystem.AdvanceClock(50);
-  }
-  mSystem.Pump();
-  EXPECT_THAT(DownClickCounts(*view), ::testing::ElementsAre(1, 2, 3, 4));
-}
-
-TEST_F(NativeWindowMouseTest, AClickAfterTheDoubleClickTimeStartsCountingAgain) {
-  auto window = MakeTopLevel(OS_Rect(0, 0, 200, 200));
-  auto view = AddView(window.get(), "view", 0, 0, 200, 200);
-  mSystem.Click(OS_Point(50, 50));
-  mSystem.AdvanceClock(50);
-  mSystem.Click(OS_Point(50, 50));
-  mSystem.AdvanceClock(mLayer.GetDoubleClickTime() + 100);
-  mSystem.Click(OS_Point(50, 50));
-  mSystem.Pump();
-  EXPECT_THAT(DownClickCounts(*view), ::testing::ElementsAre(1, 2, 1));
+  EXPECT_EQ(downs[5].GetButton(), MouseEvent::kButtonRight);
+  EXPECT_EQ(downs[6].GetButton(), MouseEvent::kButtonMiddle);
 }
 
 TEST_F(NativeWindowMouseTest, AMoveNearATripleClickKeepsItsCountAndOneFarAwayGetsTheGivenCount) {

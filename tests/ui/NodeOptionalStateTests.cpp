@@ -35,38 +35,6 @@ TEST_F(NodeOptionalState, ABareNodeReadsEverythingAsUnset) {
   EXPECT_FALSE(node.UI_GetCustomMouseEventFunction());
 }
 
-TEST_F(NodeOptionalState, EachPieceIsKeptApartFromTheOthers) {
-  auto v = MakeView(0, 0, 10, 10);
-  auto mouse = boost::make_shared<boost::function<bool(UI_Node*, const MouseEvent&, bool&)>>(
-      [](UI_Node*, const MouseEvent&, bool&) { return true; });
-  v->UI_SetCustomMouseEventFunction(mouse);
-  v->UI_SetToolTip(u"tip", 120);
-  int sizes = 0, timers = 0;
-  v->InstallSizeChangedFunction(boost::make_shared<boost::function<void()>>([&] { ++sizes; }));
-  v->InstallTimerFunction(boost::make_shared<boost::function<bool(long)>>([&](long inID) {
-    ++timers;
-    return inID == 4;
-  }));
-
-  EXPECT_EQ(v->UI_GetCustomMouseEventFunction(), mouse);
-  EXPECT_FALSE(v->UI_GetCustomPreMouseEventFunction());
-  EXPECT_FALSE(v->UI_GetCustomDrawFunction());
-  EXPECT_EQ(v->UI_GetToolTip(), u"tip");
-  EXPECT_EQ(v->UI_GetToolTipWidth(), 120);
-  v->UI_SetLocalRectF(RectF(0, 0, 20, 10));
-  EXPECT_EQ(sizes, 1);
-  EXPECT_TRUE(v->UI_DoTimerNotify(4));
-  EXPECT_FALSE(v->UI_DoTimerNotify(5));
-  EXPECT_EQ(timers, 2);
-
-  v->UI_SetCustomMouseEventFunction(nullptr);
-  v->UI_SetToolTip(u"", 0);
-  EXPECT_FALSE(v->UI_GetCustomMouseEventFunction());
-  EXPECT_TRUE(v->UI_GetToolTip().empty());
-  v->UI_SetLocalRectF(RectF(0, 0, 30, 10));
-  EXPECT_EQ(sizes, 2);  // the size callback outlives the cleared pieces
-}
-
 TEST_F(NodeOptionalState, AStoredPlacementIsAnsweredUntilTheNextPlace) {
   auto v = MakeView(0, 0, 10, 10);
   halvorn::place_data_t p;
