@@ -157,15 +157,7 @@ TEST_F(FocusAdvanceTest, WhenNothingTakesFocusItStaysAndNoKeyIsRemoved) {
   EXPECT_EQ(mPlatform.mKeyRemovals, 0);
 }
 
-TEST_F(FocusAdvanceTest, PendingKeysAreRemovedOnlyWhenFocusMoved) {
-  FocusableViewP a = AddView(*mWindow, "a");
-  AddView(*mWindow, "b");
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
-  Tab();
-  EXPECT_EQ(mPlatform.mKeyRemovals, 1);
-}
-
-TEST_F(FocusAdvanceTest, FocusFromAdvanceIsReportedWithTheAdvanceReason) {
+TEST_F(FocusAdvanceTest, FocusMovedByTabIsReportedWithTheAdvanceReasonAndRemovesPendingKeys) {
   FocusLog log;
   FocusableViewP a = AddView(*mWindow, "a", &log);
   AddView(*mWindow, "b", &log);
@@ -173,13 +165,11 @@ TEST_F(FocusAdvanceTest, FocusFromAdvanceIsReportedWithTheAdvanceReason) {
   log.clear();
   Tab();
   EXPECT_EQ(log, (FocusLog{{"a", kFocusChangeAdvance, false}, {"b", kFocusChangeAdvance, true}}));
+  EXPECT_EQ(mPlatform.mKeyRemovals, 1);
 }
 
-TEST_F(FocusAdvanceTest, ANullParentIsAContractViolation) {
+TEST_F(FocusAdvanceTest, ANullParentIsAContractViolationAndAnEmptyWindowFindsNothing) {
   EXPECT_THROW(UI_Node::UI_AdvanceFocus(true, 0, nullptr), tarsel::config::Exception);
-}
-
-TEST_F(FocusAdvanceTest, AnEmptyWindowFindsNothing) {
   EXPECT_FALSE(UI_Node::UI_AdvanceFocus(true, -1, mWindow.get()));
   EXPECT_FALSE(UI_Node::UI_AdvanceFocus(false, -1, mWindow.get()));
 }
@@ -276,43 +266,31 @@ KeyboardEvent TabKey(KeyboardEvent::Action inAction, unsigned char inMods) {
   return KeyboardEvent(inAction, 9, 9, ModifierKeys(inMods), false, OS_Event());
 }
 
-TEST_F(FocusAdvanceTest, TabKeyDownAdvancesFromTheTargetAndIsHandled) {
-  FocusableViewP a = AddView(*mWindow, "a");
-  AddView(*mWindow, "b");
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
-  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), a.get(), TabKey(KeyboardEvent::kActionKeyDown, 0)));
-  EXPECT_EQ(FocusLeafID(), "b");
-}
-
-TEST_F(FocusAdvanceTest, ShiftTabGoesBackAndCapsLockIsIgnored) {
+// Each row sends one key to the window with "b" of "a b c" focused (or no
+// target at all) and says whether it was taken and where focus is then.
+TEST_F(FocusAdvanceTest, OnlyTabOrShiftTabKeyDownsAdvanceFromTheTargetIgnoringCapsLock) {
   AddView(*mWindow, "a");
   FocusableViewP b = AddView(*mWindow, "b");
   AddView(*mWindow, "c");
-  b->UI_GainKeyboardFocus(kFocusChangeMouse);
-  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), b.get(),
-                                                 TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyCapsLock)));
-  EXPECT_EQ(FocusLeafID(), "a");
-}
-
-TEST_F(FocusAdvanceTest, OtherKeysModifiersAndActionsAreNotTaken) {
-  FocusableViewP a = AddView(*mWindow, "a");
-  AddView(*mWindow, "b");
-  a->UI_GainKeyboardFocus(kFocusChangeMouse);
-  UI_Node* w = mWindow.get();
-  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(w, a.get(), TabKey(KeyboardEvent::kActionKeyUp, 0)));
-  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(w, a.get(), TabKey(KeyboardEvent::kActionKeyDown, kModKeyCtrl)));
-  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(
-      w, a.get(), TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyAlt)));
-  EXPECT_FALSE(UI_Node::UI_DoAdvanceKeyboardFocus(
-      w, a.get(), KeyboardEvent(KeyboardEvent::kActionKeyDown, 'A', 65, ModifierKeys(), false, OS_Event())));
-  EXPECT_EQ(FocusLeafID(), "a");
-}
-
-TEST_F(FocusAdvanceTest, WithoutATargetParentTheWalkStartsInTheGivenContainer) {
-  AddView(*mWindow, "a");
-  AddView(*mWindow, "b");
-  EXPECT_TRUE(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), nullptr, TabKey(KeyboardEvent::kActionKeyDown, 0)));
-  EXPECT_EQ(FocusLeafID(), "b");  // from child 0 forward
+  const struct {
+    KeyboardEvent key;
+    bool withTarget, taken;
+    const char* to;
+  } rows[] = {
+      {TabKey(KeyboardEvent::kActionKeyDown, 0), true, true, "c"},
+      {TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyCapsLock), true, true, "a"},
+      {TabKey(KeyboardEvent::kActionKeyUp, 0), true, false, "b"},
+      {TabKey(KeyboardEvent::kActionKeyDown, kModKeyCtrl), true, false, "b"},
+      {TabKey(KeyboardEvent::kActionKeyDown, kModKeyShift | kModKeyAlt), true, false, "b"},
+      {KeyboardEvent(KeyboardEvent::kActionKeyDown, 'A', 65, ModifierKeys(), false, OS_Event()), true, false, "b"},
+      {TabKey(KeyboardEvent::kActionKeyDown, 0), false, true, "b"},  // from child 0 forward
+  };
+  for (const auto& row : rows) {
+    b->UI_GainKeyboardFocus(kFocusChangeMouse);
+    EXPECT_EQ(UI_Node::UI_DoAdvanceKeyboardFocus(mWindow.get(), row.withTarget ? b.get() : nullptr, row.key), row.taken)
+        << row.to;
+    EXPECT_EQ(FocusLeafID(), row.to);
+  }
 }
 
 // ---------------------------------------------------------------- generated trees

@@ -27,14 +27,16 @@ ThemeSupplier SupplierOf(ThemeP inTheme) {
 
 using ThemeClientTest = ThemeRegistryTest;
 
-TEST_F(ThemeClientTest, ASuppliedThemeIsUsedAndResetGoesBackToTheDefault) {
+TEST_F(ThemeClientTest, ASuppliedThemeGivesColoursAndFontNamesAndResetGoesBackToTheDefault) {
   ThemeP other(new Theme(379, 3));
   other->SetColor(19, drawbot::ColorRGBA(1, 0, 0, 1));
+  other->SetFontName(2, u"DejaVu Sans");
   CountingClient client;
   client.UI_SetThemeSupplier(SupplierOf(other));
   EXPECT_EQ(client.updates, 1);
   EXPECT_EQ(client.lastFlags, 1u);
   EXPECT_EQ(client.GetThemeColor(19), drawbot::ColorRGBA(1, 0, 0, 1));
+  EXPECT_EQ(client.GetThemeFontName(2), u"DejaVu Sans");
   client.UI_ResetThemeSupplier();
   EXPECT_EQ(client.UI_GetCurrentTheme(), Theme::GetTheme(GetDefaultThemeName()));
 }
@@ -93,37 +95,21 @@ TEST_F(ThemeClientTest, AClientWithoutCustomEntriesReadsTheThemeAndClearingStill
   EXPECT_EQ(client.GetThemeColor(1), drawbot::ColorRGBA(1, 0, 0, 1));
 }
 
-TEST_F(ThemeClientTest, FontNamesComeFromTheThemeOnly) {
-  ThemeP theme(new Theme(379, 3));
-  theme->SetFontName(2, u"DejaVu Sans");
-  CountingClient client;
-  client.UI_SetThemeSupplier(SupplierOf(theme));
-  EXPECT_EQ(client.GetThemeFontName(2), u"DejaVu Sans");
-}
-
-TEST_F(ThemeClientTest, AnOwnerGivesItsNamedThemeOrElseTheDefault) {
-  ThemeP studio(new Theme(379, 3));
-  Theme::Initialize(ThemeP(new Theme(379, 3)));
-  Theme::RegisterTheme(u"Studio", studio);
-  ThemeOwner owner;
-  EXPECT_EQ(owner.GetThemeName(), u"DefaultTolliverTheme");
-  EXPECT_FALSE(owner.HasThemeName());
-  owner.SetThemeName(u"Studio", false);
-  EXPECT_EQ(owner.GetTheme(), studio);
-  owner.SetThemeName(u"Unknown", false);
-  EXPECT_EQ(owner.GetTheme(), Theme::GetTheme(GetDefaultThemeName()));
-}
-
-TEST_F(ThemeClientTest, AClientOnAnOwnersSharedSupplierFollowsTheOwnersName) {
+TEST_F(ThemeClientTest, AnOwnerGivesItsNamedThemeOrElseTheDefaultAndClientsOnItsSupplierFollow) {
   ThemeP studio(new Theme(379, 3));
   Theme::Initialize(ThemeP(new Theme(379, 3)));
   Theme::RegisterTheme(u"Studio", studio);
   ThemeOwner owner;
   CountingClient client;
   client.UI_SetThemeSupplier(owner.GetSharedThemeSupplier());
+  EXPECT_EQ(owner.GetThemeName(), u"DefaultTolliverTheme");
+  EXPECT_FALSE(owner.HasThemeName());
   EXPECT_EQ(client.UI_GetCurrentTheme(), Theme::GetTheme(GetDefaultThemeName()));
   owner.SetThemeName(u"Studio", true);
+  EXPECT_EQ(owner.GetTheme(), studio);
   EXPECT_EQ(client.UI_GetCurrentTheme(), studio);
+  owner.SetThemeName(u"Unknown", false);
+  EXPECT_EQ(owner.GetTheme(), Theme::GetTheme(GetDefaultThemeName()));
 }
 
 TEST_F(ThemeClientTest, AClientWhoseOwnerIsGoneOrWhoseSupplierGivesNothingReadsTheDefaultTheme) {

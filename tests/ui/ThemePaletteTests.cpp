@@ -12,10 +12,12 @@ drawbot::ColorRGBA Bytes(int r, int g, int b, float a = 1) {
   return drawbot::ColorRGBA(r / 255.0f, g / 255.0f, b / 255.0f, a);
 }
 
-TEST(ThemePalette, HasEveryColourFromZeroTo378AndNoneBeyond) {
+TEST(ThemePalette, HasEveryColourFromZeroTo378AndAnswersADefaultForOthersWithoutFailing) {
   ThemeP theme(new Theme(379, 3));
   for (std::uint64_t id = 0; id < 379; ++id) EXPECT_TRUE(theme->HasColor(id)) << id;
   EXPECT_FALSE(theme->HasColor(379));
+  EXPECT_FALSE(theme->HasColor(5000));
+  EXPECT_NO_THROW(theme->GetColor(5000));
 }
 
 TEST(ThemePalette, AnswersThePaletteValuesIncludingTranslucentEntries) {
@@ -31,44 +33,28 @@ TEST(ThemePalette, AnswersThePaletteValuesIncludingTranslucentEntries) {
   EXPECT_TRUE(ColorNear(theme->GetColor(378), Bytes(0xB4, 0xB4, 0xB4)));
 }
 
-TEST(ThemePalette, BrightnessIsStoredButLeavesEveryColourAsItWas) {
+TEST(ThemePalette, BrightnessIsStoredButLeavesEveryColourAndUpdateRestoresAnOverwrittenOne) {
   ThemeP theme(new Theme(379, 3));
   std::vector<drawbot::ColorRGBA> before;
   for (std::uint64_t id = 0; id < 379; ++id) before.push_back(theme->GetColor(id));
   theme->SetBrightness(0.9f);
   EXPECT_FLOAT_EQ(theme->GetBrightness(), 0.9f);
   for (std::uint64_t id = 0; id < 379; ++id) EXPECT_EQ(theme->GetColor(id), before[id]) << id;
-}
-
-TEST(ThemePalette, UpdateRestoresAColourThatWasOverwritten) {
-  ThemeP theme(new Theme(379, 3));
-  const drawbot::ColorRGBA original = theme->GetColor(19);
   theme->SetColor(19, drawbot::ColorRGBA(1, 0, 0, 1));
   EXPECT_EQ(theme->GetColor(19), drawbot::ColorRGBA(1, 0, 0, 1));
   theme->Update();
-  EXPECT_EQ(theme->GetColor(19), original);
+  EXPECT_EQ(theme->GetColor(19), before[19]);
 }
 
-TEST(ThemePalette, AnUnknownIdentifierAnswersADefaultWithoutFailing) {
-  ThemeP theme(new Theme(379, 3));
-  EXPECT_FALSE(theme->HasColor(5000));
-  EXPECT_NO_THROW(theme->GetColor(5000));
-}
-
-TEST(ThemeFonts, ThreeFontsShareTheFirstCandidateAtSizeEleven) {
+TEST(ThemeFonts, ThreeFontsShareTheFirstCandidateAtSizeElevenWhateverTheSizeScheme) {
   ScPrivateConfigDir config;
   ThemeP theme(new Theme(379, 3));
+  theme->SetFontSizeScheme(2);
+  EXPECT_EQ(theme->GetFontSizeScheme(), 2u);
   for (std::uint64_t id = 0; id < 3; ++id) {
     EXPECT_EQ(theme->GetFontName(id), u"Tahoma") << id;
     EXPECT_FLOAT_EQ(theme->GetFontSize(id), 11) << id;
   }
-}
-
-TEST(ThemeFonts, APlainThemeIgnoresTheFontSizeScheme) {
-  ThemeP theme(new Theme(379, 3));
-  theme->SetFontSizeScheme(2);
-  EXPECT_EQ(theme->GetFontSizeScheme(), 2u);
-  EXPECT_FLOAT_EQ(theme->GetFontSize(0), 11);
 }
 
 class GB18030Setting : public ::testing::Test {
