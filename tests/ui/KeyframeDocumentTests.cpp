@@ -58,26 +58,20 @@ TEST_F(KeyframeDocument, KeyFramesInsideAThemeGroupTakeTheGroupsT) {
   ASSERT_EQ(editor->GetColorTrack(6).count(0.0f), 1u) << "a group without t still groups, at t 0";
 }
 
-TEST_F(KeyframeDocument, NumbersThatDoNotReadLeaveTheirElementOutAndUnknownIdsAreKept) {
+TEST_F(KeyframeDocument, ElementsLackingAnAttributeOrWithNumbersThatDoNotReadAreLeftOutAndUnknownIdsKept) {
   ParseDirectly(R"(<ThemeColors>
       <KeyFrame name="5" t="zero" v="0.9"/> <KeyFrame name="6" t="0" v="x"/>
       <KeyFrame name="400" t="0" v="0.5"/> <FontSize name="3" scheme="1" size="20"/>
-    </ThemeColors>)");
-  EXPECT_FALSE(editor->HasColorTrack(5));
-  EXPECT_FALSE(editor->HasColorTrack(6));
-  EXPECT_TRUE(editor->HasColorTrack(400));
-  EXPECT_TRUE(editor->HasFontSizeTrack(3));
-}
-
-TEST_F(KeyframeDocument, KeyFramesLackingNameTOrVAreSkipped) {
-  ParseDirectly(R"(<ThemeColors>
-      <KeyFrame t="0" v="0.2"/> <KeyFrame name="5" v="0.2"/> <KeyFrame name="6" t="0"/>
+      <KeyFrame t="0" v="0.2"/> <KeyFrame name="8" v="0.2"/> <KeyFrame name="9" t="0"/>
       <KeyFrame name="7" t="0" v="0.4" hold="yes"/>
+      <FontSize name="1" size="15"/><FontSize scheme="1" size="15"/>
     </ThemeColors>)");
-  EXPECT_FALSE(editor->HasColorTrack(5));
-  EXPECT_FALSE(editor->HasColorTrack(6));
+  for (std::uint64_t id : {5, 6, 8, 9}) EXPECT_FALSE(editor->HasColorTrack(id)) << id;
+  EXPECT_TRUE(editor->HasColorTrack(400));
   ASSERT_TRUE(editor->HasColorTrack(7));
   EXPECT_FALSE(editor->GetColorTrack(7).at(0.0f).mHold);
+  EXPECT_EQ(editor->GetFontSizeTracks().size(), 1u);
+  EXPECT_TRUE(editor->HasFontSizeTrack(3));
 }
 
 TEST_F(KeyframeDocument, StrictModeRefusesIncompleteElements) {
@@ -86,21 +80,15 @@ TEST_F(KeyframeDocument, StrictModeRefusesIncompleteElements) {
   ExpectRefused(R"(<ThemeColors><FontSize name="0" size="9"/></ThemeColors>)", "FontSize");
 }
 
-TEST_F(KeyframeDocument, ADocumentReplacesWholeTracksAndLeavesOthers) {
+TEST_F(KeyframeDocument, ADocumentReplacesWholeTracksLeavingOthersAndALaterKeyAtTheSameTWins) {
   editor->SetColorKeyValue(5, 0.3f, KeyValue(0, 0, 0.9f, 1, false));
   editor->SetColorKeyValue(6, 0, KeyValue(0, 0, 0.1f, 1, false));
-  editor->LoadKeyframes(R"(<ThemeColors><KeyFrame name="5" t="0" v="0.2"/></ThemeColors>)");
-  ASSERT_EQ(editor->GetColorTrack(5).size(), 1u);
-  EXPECT_EQ(editor->GetColorTrack(5).count(0.0f), 1u);
-  EXPECT_TRUE(editor->HasColorTrack(6));
-}
-
-TEST_F(KeyframeDocument, ASecondKeyFrameAtTheSameTOverwritesTheFirst) {
   editor->LoadKeyframes(R"(<ThemeColors>
       <KeyFrame name="5" t="0" v="0.2"/><KeyFrame name="5" t="0" v="0.6"/>
     </ThemeColors>)");
   ASSERT_EQ(editor->GetColorTrack(5).size(), 1u);
   EXPECT_FLOAT_EQ(editor->GetColorTrack(5).at(0.0f).mValue, 0.6f);
+  EXPECT_TRUE(editor->HasColorTrack(6));
 }
 
 TEST_F(KeyframeDocument, LoadingTwiceGivesTheSameTracksAsOnce) {
@@ -127,12 +115,6 @@ TEST_F(KeyframeDocument, TheTracksTakeEffectAtTheEndOfTheDocument) {
   EXPECT_FLOAT_EQ(editor->GetFontSize(1), 15);
 }
 
-TEST_F(KeyframeDocument, FontSizesLackingAnAttributeAreSkipped) {
-  editor->LoadKeyframes(R"(<ThemeColors><FontSize name="1" size="15"/><FontSize scheme="1" size="15"/>
-    </ThemeColors>)");
-  EXPECT_TRUE(editor->GetFontSizeTracks().empty());
-}
-
 class KeyframeDocumentRefusal : public KeyframeDocument {
  protected:
   void SetUp() override {
@@ -149,12 +131,11 @@ class KeyframeDocumentRefusal : public KeyframeDocument {
   drawbot::ColorRGBA colorBefore;
 };
 
-TEST_F(KeyframeDocumentRefusal, ADocumentThatIsNotWellFormed) {
+TEST_F(KeyframeDocumentRefusal, ADocumentThatIsNotWellFormedOrEmpty) {
   ExpectRefused(R"(<ThemeColors><KeyFrame name="5" t="0" v="0.9"/><FontSize name="0" scheme="1" size="20"/>)",
                 "line");
+  ExpectRefused("", "line");
 }
-
-TEST_F(KeyframeDocumentRefusal, AnEmptyText) { ExpectRefused("", "line"); }
 
 class DefaultKeyframes : public ::testing::Test {
  protected:
@@ -162,23 +143,19 @@ class DefaultKeyframes : public ::testing::Test {
   KeyframeThemeEditorP theme = MakeDefaultKeyframeTheme();
 };
 
-TEST_F(DefaultKeyframes, LowBrightnessIsTheDarkLookAndHighBrightnessTheLight) {
+TEST_F(DefaultKeyframes, LowBrightnessIsTheDarkLookAndHighTheLightWhileAccentsKeepThePalette) {
   theme->SetBrightness(0);
   EXPECT_LT(theme->GetColor(2).red, 0.2f);    // panel fill
   EXPECT_GT(theme->GetColor(1).red, 0.7f);    // text
   EXPECT_EQ(theme->GetIconType(), 0) << "light glyphs on the dark panels";
+  ThemeP plain(new Theme(379, 3));
+  EXPECT_EQ(theme->GetColor(18), plain->GetColor(18)) << "accent blue keeps its palette value";
+  EXPECT_EQ(theme->GetColor(0), plain->GetColor(0)) << "so does the white overlay";
+  EXPECT_FALSE(theme->HasColor(18));
   theme->SetBrightness(1);
   EXPECT_TRUE(ColorNear(theme->GetColor(2), Grey(1)));
   EXPECT_TRUE(ColorNear(theme->GetColor(1), Grey(0x26 / 255.0f)));
   EXPECT_EQ(theme->GetIconType(), 1) << "the dark \"_D\" glyphs on the light panels";
-}
-
-TEST_F(DefaultKeyframes, AccentColoursAndOverlaysKeepTheirPaletteValues) {
-  ThemeP plain(new Theme(379, 3));
-  theme->SetBrightness(0);
-  EXPECT_EQ(theme->GetColor(18), plain->GetColor(18));   // accent blue
-  EXPECT_EQ(theme->GetColor(0), plain->GetColor(0));     // white overlay
-  EXPECT_FALSE(theme->HasColor(18));
 }
 
 TEST_F(DefaultKeyframes, TheSchemesGiveSmallMediumAndLargeFonts) {

@@ -40,17 +40,13 @@ class TimerManagerTest : public ::testing::Test {
   int mCreated = 0;
 };
 
-TEST_F(TimerManagerTest, UnknownKeyHasNoRecord) {
-  UI_NodeTimerManager manager(kNodeA);
-  EXPECT_EQ(manager.GetTimerData(12345), nullptr);
-  EXPECT_EQ(manager.GetTimerDataIter(12345), manager.End());
-}
-
-TEST_F(TimerManagerTest, WithoutAFactoryPlainRecordsAreMade) {
+TEST_F(TimerManagerTest, WithoutAFactoryPlainRecordsAreMadeAndAnUnknownKeyHasNone) {
   UI_NodeTimerManager manager(kNodeA);
   const auto key = manager.CreateTimer(kNodeA, 3, 1.0f);
   ASSERT_NE(manager.GetTimerData(key), nullptr);
   EXPECT_EQ(manager.GetTimerData(key)->GetTimerID(), 3);
+  EXPECT_EQ(manager.GetTimerData(12345), nullptr);
+  EXPECT_EQ(manager.GetTimerDataIter(12345), manager.End());
 }
 
 TEST_F(TimerManagerTest, AFactoryThatRefusesLeavesNoTimer) {
@@ -60,25 +56,19 @@ TEST_F(TimerManagerTest, AFactoryThatRefusesLeavesNoTimer) {
   EXPECT_EQ(manager.GetTimerCount(), 0u);
 }
 
-TEST_F(TimerManagerTest, RemoveTimerDropsTheFirstMatchAndEveryCopyOfItsKey) {
+TEST_F(TimerManagerTest, RemoveTimerDropsTheFirstMatchAndEveryCopyOfItsKeyOrAnswersFalse) {
   UI_NodeTimerManager manager(kNodeA, TrackingFactory());
   std::list<long> keys;
   const auto k1 = manager.CreateTimer(kNodeA, 1, 0.1f);
   const auto k2 = manager.CreateTimer(kNodeA, 2, 0.1f);
   keys = {k1, k2, k1};
+  EXPECT_FALSE(manager.RemoveTimer(kNodeA, 9, keys)) << "no key carries the id";
+  EXPECT_EQ(keys.size(), 3u);
   EXPECT_TRUE(manager.RemoveTimer(kNodeA, 1, keys));
   EXPECT_EQ(keys, (std::list<long>{k2}));
   EXPECT_EQ(manager.GetTimerData(k1), nullptr);
   EXPECT_NE(manager.GetTimerData(k2), nullptr);
   EXPECT_EQ(mKilled, (std::vector<long>{1}));
-}
-
-TEST_F(TimerManagerTest, RemoveTimerAnswersFalseWhenNoKeyCarriesTheID) {
-  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
-  std::vector<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f)};
-  EXPECT_FALSE(manager.RemoveTimer(kNodeA, 9, keys));
-  EXPECT_EQ(keys.size(), 1u);
-  EXPECT_TRUE(mKilled.empty());
 }
 
 TEST_F(TimerManagerTest, RemoveTimerPassesOverKeysWhoseRecordIsAlreadyGone) {
@@ -92,23 +82,17 @@ TEST_F(TimerManagerTest, RemoveTimerPassesOverKeysWhoseRecordIsAlreadyGone) {
   EXPECT_EQ(manager.GetTimerData(fresh), nullptr);
 }
 
-TEST_F(TimerManagerTest, RemoveAllTimersEmptiesTheKeysAndEndsEachRecord) {
-  UI_NodeTimerManager manager(kNodeA, TrackingFactory());
-  std::list<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f), manager.CreateTimer(kNodeA, 2, 0.1f)};
-  const auto other = manager.CreateTimer(kNodeB, 3, 0.1f);
-  manager.RemoveAllTimers(kNodeA, keys);
-  EXPECT_TRUE(keys.empty());
-  EXPECT_EQ(mKilled, (std::vector<long>{1, 2}));
-  EXPECT_NE(manager.GetTimerData(other), nullptr);
-}
-
-TEST_F(TimerManagerTest, ManagerEndsEveryRecordWhenItDies) {
+TEST_F(TimerManagerTest, RemoveAllTimersEndsTheNodesRecordsAndTheManagerEndsTheRestWhenItDies) {
   {
     UI_NodeTimerManager manager(kNodeA, TrackingFactory());
-    manager.CreateTimer(kNodeA, 1, 0.1f);
-    manager.CreateTimer(kNodeB, 2, 0.1f);
+    std::list<long> keys{manager.CreateTimer(kNodeA, 1, 0.1f), manager.CreateTimer(kNodeA, 2, 0.1f)};
+    const auto other = manager.CreateTimer(kNodeB, 3, 0.1f);
+    manager.RemoveAllTimers(kNodeA, keys);
+    EXPECT_TRUE(keys.empty());
+    EXPECT_EQ(mKilled, (std::vector<long>{1, 2}));
+    EXPECT_NE(manager.GetTimerData(other), nullptr);
   }
-  EXPECT_EQ(mKilled.size(), 2u);
+  EXPECT_EQ(mKilled, (std::vector<long>{1, 2, 3}));
 }
 
 TEST_F(TimerManagerTest, ARecordKeptElsewhereOutlivesItsRemovalButIsNoLongerFound) {
@@ -123,16 +107,13 @@ TEST_F(TimerManagerTest, ARecordKeptElsewhereOutlivesItsRemovalButIsNoLongerFoun
   EXPECT_EQ(mKilled, (std::vector<long>{1}));
 }
 
-TEST(UI_NodeTimerData, IntervalInMillisecondsIsTruncated) {
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 0.0159f).GetMilliseconds(), 15u);
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 2.0f).GetMilliseconds(), 2000u);
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 0.0f).GetMilliseconds(), 0u);
-}
-
-TEST(UI_NodeTimerData, NegativeOrNonNumberIntervalsBecomeZero) {
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, -1.0f).GetMilliseconds(), 0u);
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, std::nanf("")).GetMilliseconds(), 0u);
-  EXPECT_EQ(UI_NodeTimerData(nullptr, 1, 1e30f).GetMilliseconds(), 4294967295u);
+TEST(UI_NodeTimerData, IntervalInMillisecondsIsTruncatedAndNegativeOrNonNumberIntervalsBecomeZero) {
+  const struct {
+    float seconds;
+    unsigned milliseconds;
+  } rows[] = {{0.0159f, 15u}, {2.0f, 2000u}, {0.0f, 0u}, {-1.0f, 0u}, {std::nanf(""), 0u}, {1e30f, 4294967295u}};
+  for (const auto& row : rows)
+    EXPECT_EQ(UI_NodeTimerData(nullptr, 1, row.seconds).GetMilliseconds(), row.milliseconds) << row.seconds;
 }
 
 }  // namespace
