@@ -96,5 +96,65 @@ TEST_F(HitThroughSiblings, MovedScaledAndCollapsedSiblingsAreEachTestedInTheirOw
   EXPECT_EQ(p, PointF(30, 15));
 }
 
+// A view whose class replaces what the walks read from a plain view's fields:
+// it is moved by an extra offset, hit only in its left half, and hidden on
+// request whatever its flag says.
+class CustomGeometryView : public RecordingView {
+ public:
+  Matrix UI_GetSelfToParentMatrix() const override {
+    ++matrixCalls;
+    return Matrix::Translation(extra.x, extra.y).Concat(UI_SubView::UI_GetSelfToParentMatrix());
+  }
+  bool UI_HitTest(const PointF& inPoint) const override {
+    ++hitCalls;
+    return inPoint.x < UI_GetLocalRectF(false).width / 2 && UI_SubView::UI_HitTest(inPoint);
+  }
+  bool UI_IsShown() const override { return !forceHidden && UI_SubView::UI_IsShown(); }
+
+  PointF extra;
+  bool forceHidden = false;
+  mutable int matrixCalls = 0;
+  mutable int hitCalls = 0;
+};
+
+using OverridingViews = ManagerTest;
+
+TEST_F(OverridingViews, MappingThroughAChainAsksTheOverriddenMatrixAtItsLevel) {
+  auto root = MakeView(0, 0, 1000, 1000, nullptr, "root");
+  auto plain = MakeView(10, 20, 900, 900, root.get());
+  boost::intrusive_ptr<CustomGeometryView> custom(new CustomGeometryView);
+  custom->UI_SetLocalRectF(RectF(1, 2, 800, 800));
+  custom->UI_Show(true);
+  custom->extra = PointF(100, 200);
+  plain->ChildPushBack(custom);
+  auto leaf = MakeView(3, 4, 10, 10, custom.get());
+  custom->matrixCalls = 0;  // invalidations asked it while the chain was built
+
+  EXPECT_EQ(leaf->UI_LocalToGlobalF(PointF(0.5f, 0.25f)), PointF(114.5f, 226.25f));
+  EXPECT_EQ(UI_Node::UI_GetSelfToSpecificParentMatrix(leaf.get(), plain.get()), Matrix::Translation(104, 206));
+  EXPECT_EQ(custom->matrixCalls, 2);
+}
+
+TEST_F(OverridingViews, ChildHitAsksTheOverriddenShowAndHitTestsAndFallsThroughToTheViewBelow) {
+  auto root = MakeView(0, 0, 200, 200, nullptr, "root");
+  auto below = MakeView(0, 0, 100, 100, root.get(), "below");
+  boost::intrusive_ptr<CustomGeometryView> top(new CustomGeometryView);
+  top->UI_SetLocalRectF(RectF(0, 0, 100, 100));
+  top->UI_Show(true);
+  root->ChildPushBack(top);
+  top->hitCalls = 0;
+
+  struct Case { PointF at; bool hidden; UI_Node* expected; } cases[] = {
+      {PointF(25, 50), false, top.get()}, {PointF(75, 50), false, below.get()}, {PointF(25, 50), true, below.get()}};
+  for (const Case& c : cases) {
+    top->forceHidden = c.hidden;
+    PointF p = c.at;
+    auto hit = root->GetChildHit(false, true, p);
+    ASSERT_TRUE(hit.first) << "at " << c.at.x << " hidden " << c.hidden;
+    EXPECT_EQ(hit.second->get(), c.expected) << "at " << c.at.x << " hidden " << c.hidden;
+  }
+  EXPECT_EQ(top->hitCalls, 2);
+}
+
 }  // namespace
 }  // namespace norvik::ui::test

@@ -8,6 +8,7 @@
 #include "tarsel/MatrixT.h"
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
+#include "ui/src/PlainViewGeometry.h"
 
 namespace norvik::ui {
 
@@ -152,22 +153,43 @@ void UI_Container::ChildRemoved(UI_Node*) {}
 
 void UI_Container::ChildOrderChanged() {}
 
+namespace {
+
+using PointF = tarsel::geom::PointT<float>;
+using Matrix = tarsel::geom::ScaleMatrixT<float>;
+
+constexpr std::ptrdiff_t kPrefetchAhead = 8;
+
+// The point in the child's space when the child covers it; asks the child's
+// own virtual operations when its class overrides any of them.
+bool HitsChild(const UI_Node& inChild, const UI_Node* inScrollingParent, const PointF& inPoint, PointF& outLocal) {
+  const bool plain = plainview::KeepsViewHitTest(inChild);
+  if (!(plain ? plainview::ViewIsShown(inChild) : inChild.UI_IsShown())) return false;
+  const Matrix m = plain ? plainview::ViewStep(inChild, inScrollingParent) : inChild.UI_GetSelfToParentMatrix();
+  if (m.IsTranslationOnly()) {
+    // Most children are only moved: undo the offset instead of inverting.
+    outLocal = PointF(inPoint.x - m.tx, inPoint.y - m.ty);
+  } else {
+    if (!m.IsInvertible()) return false;  // a view scaled to nothing covers no point
+    outLocal = m.Inverse().Transform(inPoint);
+  }
+  return plain ? plainview::ViewHitTest(inChild, outLocal) : inChild.UI_HitTest(outLocal);
+}
+
+}  // namespace
+
 std::pair<bool, UI_Container::iterator> UI_Container::GetChildHit(bool inRecursive, bool inSkipOSChildren,
                                                                    tarsel::geom::PointT<float>& ioPoint) {
+  // The children of one container share their parent: whether it scrolls them is asked once.
+  const UI_Node* scrolling = plainview::ScrollingParent(GetAsANode());
   for (auto it = mChildren.rbegin(); it != mChildren.rend(); ++it) {
     UI_Node* child = it->get();
-    if (inSkipOSChildren && child->UI_ReceivesEventsFromOS()) continue;
-    if (!child->UI_IsShown()) continue;
-    const tarsel::geom::ScaleMatrixT<float> m = child->UI_GetSelfToParentMatrix();
-    tarsel::geom::PointT<float> local;
-    if (m.IsTranslationOnly()) {
-      // Most children are only moved: undo the offset instead of inverting.
-      local = tarsel::geom::PointT<float>(ioPoint.x - m.tx, ioPoint.y - m.ty);
-    } else {
-      if (!m.IsInvertible()) continue;  // a view scaled to nothing covers no point
-      local = m.Inverse().Transform(ioPoint);
-    }
-    if (!child->UI_HitTest(local)) continue;
+    // A wide container's children do not stay in the cache between two
+    // walks; fetching a few ahead overlaps their loads with the tests.
+    if (mChildren.rend() - it > kPrefetchAhead) plainview::Prefetch(*it[kPrefetchAhead]);
+    if (inSkipOSChildren && !plainview::KeepsViewNotNative(*child) && child->UI_ReceivesEventsFromOS()) continue;
+    PointF local;
+    if (!HitsChild(*child, scrolling, ioPoint, local)) continue;
     iterator hit = it.base() - 1;
     ioPoint = local;
     if (inRecursive) {

@@ -6,6 +6,7 @@
 #include "drawbot/CacheInterface.h"
 #include "tarsel/ThrowError.h"
 #include "ui/UI_NodeManager.h"
+#include "ui/src/PlainViewGeometry.h"
 #include "ui/src/UI_NodeExtras.h"
 
 namespace norvik::ui {
@@ -203,7 +204,11 @@ bool UI_Node::UI_HandleDrop(const PointF&, datatransfer::OS_ReceiveData*, unsign
 }
 
 void UI_Node::UI_GetOSControlClipRects(OSControlClipRects& ioRects) const {
-  for (const UI_NodeP& child : mChildren) child->UI_GetOSControlClipRects(ioRects);
+  for (const UI_NodeP& child : mChildren) {
+    // Every paint asks the whole tree; a leaf that keeps this walk adds nothing.
+    if (child->ChildSize() == 0 && plainview::KeepsNodeClipRects(*child)) continue;
+    child->UI_GetOSControlClipRects(ioRects);
+  }
 }
 
 bool UI_Node::UI_PerformUserResizingDraw() {

@@ -10,6 +10,7 @@
 #include "drawbot/SupplierInterface.h"
 #include "drawbot/SurfaceInterface.h"
 #include "ui/UI_Node.h"
+#include "ui/src/PlainViewGeometry.h"
 
 namespace norvik::ui {
 
@@ -42,10 +43,12 @@ ThemeStamp CurrentThemeStamp(const UI_Node& inNode) {
 // the clip in the child's coordinates outwards, each by less than a unit.
 // Whether the child is shown or native is left to the full dispatch, which
 // asks again anyway: here it would only double the calls for every child.
-bool MayTouchClip(const UI_Node& inChild, const UI_Node::RectL& inClip) {
-  const UI_Node::Matrix m = inChild.UI_GetSelfToParentMatrix();
+bool MayTouchClip(const UI_Node& inChild, const UI_Node* inScrollingParent, const UI_Node::RectL& inClip) {
+  const bool plain = plainview::KeepsViewGeometry(inChild);
+  const UI_Node::Matrix m =
+      plain ? plainview::ViewStep(inChild, inScrollingParent) : inChild.UI_GetSelfToParentMatrix();
   if (!(std::fabs(m.sx) > kMinimumScale) || !(std::fabs(m.sy) > kMinimumScale)) return false;
-  const UI_Node::RectF local = inChild.UI_GetLocalRectF(false);
+  const UI_Node::RectF local = plain ? plainview::ViewLocalRect(inChild) : inChild.UI_GetLocalRectF(false);
   const double sx = m.sx, sy = m.sy;
   const double x1 = local.left * sx + m.tx, x2 = local.Right() * sx + m.tx;
   const double y1 = local.top * sy + m.ty, y2 = local.Bottom() * sy + m.ty;
@@ -85,9 +88,10 @@ void UI_Node::UI_DispatchDrawToChildren(drawbot::Drawbot* inDrawbot) {
   const RectL clip = surface->GetClipBounds();
   if (clip.IsEmpty()) return;
   std::vector<UI_NodeP> drawn;
+  const UI_Node* scrolling = plainview::ScrollingParent(this);
   for (std::size_t i = 0; i < mChildren.size(); ++i) {
     UI_Node* child = mChildren[i].get();
-    if (MayTouchClip(*child, clip)) drawn.emplace_back(child);
+    if (MayTouchClip(*child, scrolling, clip)) drawn.emplace_back(child);
   }
   for (const UI_NodeP& child : drawn) {
     if (child->UI_GetParentContainer() != this) continue;

@@ -6,6 +6,7 @@
 #include "tarsel/ThrowError.h"
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
+#include "ui/src/PlainViewGeometry.h"
 
 namespace norvik::ui {
 
@@ -41,23 +42,45 @@ UI_Node::RectL UI_Node::UI_EnclosingRect(const RectF& inRect) {
 }
 
 UI_Node::Matrix UI_Node::UI_GetSelfToSpecificParentMatrix(const UI_Node* inNode, const UI_Node* inStop) {
-  Matrix result;
-  for (const UI_Node* node = inNode; node; node = node->UI_GetParentNode()) {
-    if (node == inStop) return result;
-    const Matrix step = node->UI_GetSelfToParentMatrix();
-    if (step.IsTranslationOnly()) {
-      // A level that only moves adds its offset; no products needed.
-      result.tx += step.tx;
-      result.ty += step.ty;
-    } else {
-      result = step.Concat(result);
+  float sx = 1, sy = 1, tx = 0, ty = 0;
+  const UI_Node* node = inNode;
+  while (node && node != inStop) {
+    // Views that are only moved, read from their fields: an add a level, in a
+    // loop without calls, so that the result stays in registers. The exits
+    // are branches, so the next level's address waits on one load only.
+    while (plainview::KeepsViewMatrix(*node) && plainview::ViewIsOnlyMoved(*node)) {
+      const UI_Container* up = node->UI_GetParentContainer();
+      if (!up || !up->GetAsANode()) break;  // the top of the chain takes the general step
+      const UI_Node* parent = static_cast<const UI_Node*>(up);
+      if (plainview::ScrollingParent(parent)) break;
+      const RectF& rect = plainview::Fields::Rect(static_cast<const UI_SubView&>(*node));
+      tx += rect.left;
+      ty += rect.top;
+      node = parent;
+      if (node == inStop) return Matrix(sx, sy, tx, ty);
     }
+    const UI_Node* parent = node->UI_GetParentNode();
+    const Matrix step = plainview::KeepsViewMatrix(*node)
+                            ? plainview::ViewStep(*node, plainview::ScrollingParent(parent))
+                            : node->UI_GetSelfToParentMatrix();
+    if (step.IsTranslationOnly()) {
+      tx += step.tx;
+      ty += step.ty;
+    } else {
+      const Matrix composed = step.Concat(Matrix(sx, sy, tx, ty));
+      sx = composed.sx;
+      sy = composed.sy;
+      tx = composed.tx;
+      ty = composed.ty;
+    }
+    node = parent;
   }
+  if (node) return Matrix(sx, sy, tx, ty);
   if (inStop) {
     tarsel::config::ThrowError(tarsel::config::ErrorLevel::kError,
                                "$$$/norvik/ui/Error/ParentNotFound=Parent not found.");
   }
-  return result;
+  return Matrix(sx, sy, tx, ty);
 }
 
 UI_Node::Matrix UI_Node::UI_GetSelfToRootMatrix(const UI_Node* inNode) {
