@@ -49,9 +49,12 @@ UI_Node* UI_Node::UI_GetParentEventRecipientNode() const {
 }
 
 std::vector<UI_Node*> UI_Node::UI_GetNodeParents() {
-  std::vector<UI_Node*> chain;
-  for (UI_Node* p = this; p; p = p->UI_GetParentNode()) chain.push_back(p);
-  return std::vector<UI_Node*>(chain.rbegin(), chain.rend());
+  // Counted first, so that the chain is allocated once and filled from its end.
+  std::size_t depth = 0;
+  for (UI_Node* p = this; p; p = p->UI_GetParentNode()) ++depth;
+  std::vector<UI_Node*> chain(depth);
+  for (UI_Node* p = this; p; p = p->UI_GetParentNode()) chain[--depth] = p;
+  return chain;
 }
 
 bool UI_Node::UI_IsChildOf(const UI_Node& inNode) const {

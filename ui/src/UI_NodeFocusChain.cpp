@@ -3,6 +3,8 @@
 // changes only the part of the two chains below their common ancestor.
 #include <algorithm>
 
+#include <boost/container/small_vector.hpp>
+
 #include "ui/UI_Node.h"
 #include "ui/UI_NodeManager.h"
 
@@ -10,10 +12,16 @@ namespace norvik::ui {
 
 namespace {
 
-std::vector<UI_NodeP> StrongChain(UI_Node* inLeaf) {
-  std::vector<UI_NodeP> chain;
-  if (!inLeaf) return chain;
-  for (UI_Node* p : inLeaf->UI_GetNodeParents()) chain.emplace_back(p);
+// Focus moves at every Tab: the chains of a step live on the stack, and only
+// the two tails (the part of each chain below the common ancestor) and the
+// list of changed nodes reach the heap.
+using Chain = boost::container::small_vector<UI_NodeP, 24>;
+
+// Root first, inLeaf last.
+Chain StrongChain(UI_Node* inLeaf) {
+  Chain chain;
+  for (UI_Node* p = inLeaf; p; p = p->UI_GetParentNode()) chain.emplace_back(p);
+  std::reverse(chain.begin(), chain.end());
   return chain;
 }
 
@@ -32,9 +40,12 @@ void UI_Node::UI_SetKeyboardFocusState(bool inGaining, const std::vector<UI_Node
   if (!manager || manager->mGroupingFocus > 0) return;
   UI_NodeManager::ScUpdatingFocus updating(manager);
   const bool emptyTail = inTail.empty();
-  std::vector<UI_NodeP> nodes(inTail);
-  if (emptyTail && inLeaf) nodes.emplace_back(inLeaf);
-  for (const UI_NodeP& x : nodes) {
+  // The caller holds the tail; only the leaf of an empty tail needs holding here.
+  const UI_NodeP leafOnly[1] = {emptyTail ? UI_NodeP(inLeaf) : UI_NodeP()};
+  const UI_NodeP* first = emptyTail ? leafOnly : inTail.data();
+  const UI_NodeP* last = emptyTail ? leafOnly + (inLeaf ? 1 : 0) : inTail.data() + inTail.size();
+  for (const UI_NodeP* it = first; it != last; ++it) {
+    const UI_NodeP& x = *it;
     const bool isLeaf = x.get() == inLeaf;
     if (!isLeaf && x->mHasKeyboardFocus == inGaining) continue;
     if (x->UI_InvalidateOnKeyboardFocusChange(isLeaf)) x->UI_Invalidate(nullptr, 0);
@@ -71,11 +82,12 @@ bool UI_Node::UI_GainKeyboardFocus(FocusChangeReason inReason) {
     if (old.get() != this) {
       manager->mPreviousKeyboardFocusLeaf = old.get();
       manager->mKeyboardFocusLeaf = this;
-      std::vector<UI_NodeP> oldChain = StrongChain(old.get());
-      std::vector<UI_NodeP> newChain = StrongChain(this);
+      const Chain oldChain = StrongChain(old.get());
+      const Chain newChain = StrongChain(this);
       auto common = std::mismatch(oldChain.begin(), oldChain.end(), newChain.begin(), newChain.end());
-      std::vector<UI_NodeP> oldTail(common.first, oldChain.end());
-      std::vector<UI_NodeP> newTail(common.second, newChain.end());
+      const std::vector<UI_NodeP> oldTail(common.first, oldChain.end());
+      const std::vector<UI_NodeP> newTail(common.second, newChain.end());
+      changed.reserve(oldTail.size() + newTail.size() + 2);
       UI_SetKeyboardFocusState(false, oldTail, old.get(), changed, inReason);
       UI_SetKeyboardFocusState(true, newTail, this, changed, inReason);
     }
@@ -105,7 +117,7 @@ void UI_Node::UI_UpdateKeyboardFocusStateDueToLoss() {
     UI_NodeManager::ScUpdatingFocus updating(manager);
     UI_NodeP leaf(manager->mKeyboardFocusLeaf);
     if (leaf && (leaf.get() == this || leaf->UI_IsChildOf(*this))) {
-      std::vector<UI_NodeP> chain = StrongChain(leaf.get());
+      const Chain chain = StrongChain(leaf.get());
       auto self = std::find_if(chain.begin(), chain.end(), [this](const UI_NodeP& n) { return n.get() == this; });
       manager->mKeyboardFocusLeaf = self == chain.begin() ? nullptr : (self - 1)->get();
       manager->mPreviousKeyboardFocusLeaf = leaf.get();
