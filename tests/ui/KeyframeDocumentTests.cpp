@@ -43,6 +43,8 @@ TEST_F(KeyframeDocument, ReadsKeyFramesWithTheirOptionalAttributes) {
   ASSERT_EQ(track.size(), 2u);
   EXPECT_EQ(track.at(0.0f), KeyValue(30, 0.5f, 0.2f, 0.75f, true));
   EXPECT_EQ(track.at(1.0f), KeyValue(0, 0, 0.8f, 1, false));
+  ParseDirectly(R"(<ThemeColors><KeyFrame name="7" t="0" v="0.5" h="-1e38" s="1"/></ThemeColors>)");
+  EXPECT_LE(editor->GetColor(7).red, 1.0f) << "a hue far beyond any integer still reduces to a colour";
 }
 
 TEST_F(KeyframeDocument, KeyFramesInsideAThemeGroupTakeTheGroupsT) {

@@ -14,14 +14,18 @@ namespace norvik::ui {
 
 namespace {
 
-float Clamp01(float inValue) { return std::min(std::max(inValue, 0.0f), 1.0f); }
+// Interpolating between extreme key frames can leave any float here: what is
+// not a number counts as 0.
+float Clamp01(float inValue) { return inValue > 0 ? std::min(inValue, 1.0f) : 0.0f; }
 
 drawbot::ColorRGBA ColorFromKeyValue(const KeyValue& inValue) {
   const float s = Clamp01(inValue.mSaturation);
   const float v = Clamp01(inValue.mValue);
   const float a = Clamp01(inValue.mAlpha);
-  // Hue is whole degrees, reduced like an integer remainder.
-  long hue = static_cast<long>(inValue.mHue) % 360;
+  // Hue is whole degrees, reduced like an integer remainder, but as a float
+  // first: an interpolated hue can lie far beyond any integer.
+  const float degrees = std::isfinite(inValue.mHue) ? std::fmod(std::trunc(inValue.mHue), 360.0f) : 0.0f;
+  long hue = static_cast<long>(degrees);
   if (!(s > 0)) hue = 0;
   return drawbot::HSBtoRGB(static_cast<float>(hue), s, v, a);
 }
