@@ -229,18 +229,14 @@ TEST(CheckboxMark, OffIsBlankOnIsATickMixedAndUnknownAreABar) {
 
 // ---- the disclosure triangle ----
 
-TEST(DisclosureTriangleFace, DuringTheTwirlItTurnsTowardsTheValue) {
+TEST(DisclosureTriangleFace, DuringTheTwirlItTurnsTowardsTheValueAndWhileHeldFollowsThePressLook) {
   const DrawParameters params;
   EXPECT_FLOAT_EQ(DrawTrianglePicture(params, 0.025, 0.1, true, false, 1).GetAngle(StateFlags()), 22.5f);
   EXPECT_FLOAT_EQ(DrawTrianglePicture(params, 0.025, 0.1, false, false, 1).GetAngle(StateFlags()), 67.5f);
   EXPECT_FLOAT_EQ(DrawTrianglePicture(params, 0.5, 0.1, true, false, 1).GetAngle(StateFlags()), 90.0f)
       << "past the duration it rests";
-}
-
-TEST(DisclosureTriangleFace, WhileHeldItFollowsThePressLook) {
-  const DrawParameters params;
   const DrawTrianglePicture held(params, -1, 0.075, false, true, 1);
-  EXPECT_EQ(held.GetAngle(StateFlags(UI_ControlView::kStateDown)), 90.0f);
+  EXPECT_EQ(held.GetAngle(StateFlags(UI_ControlView::kStateDown)), 90.0f) << "while held it follows the press look";
   EXPECT_EQ(held.GetAngle(StateFlags()), 0.0f);
 }
 

@@ -36,6 +36,7 @@ class PictureButtonTest : public ControlTest {
 
 TEST_F(PictureButtonTest, TheSupplyFunctionSeesTheStateAndAnswersTheImage) {
   auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
+  EXPECT_EQ(button->GetImage(), nullptr) << "no supply function, no image";
   DrawParameters::StateFlags seen;
   button->SetImageSupplyFunction([&](UI_PictureSupplyMessage* inMessage) {
     seen = inMessage->GetStateFlags();
@@ -45,11 +46,6 @@ TEST_F(PictureButtonTest, TheSupplyFunctionSeesTheStateAndAnswersTheImage) {
   button->SetDownState(true);
   EXPECT_EQ(button->GetImage(), image.Get());
   EXPECT_TRUE(seen.Test(UI_ControlView::kStateDown));
-}
-
-TEST_F(PictureButtonTest, WithoutASupplyFunctionThereIsNoImage) {
-  auto button = Add(new UI_PictureButton, RectF(0, 0, 20, 20));
-  EXPECT_EQ(button->GetImage(), nullptr);
 }
 
 TEST_F(PictureButtonTest, ThePictureIsCentredOnWholePixels) {

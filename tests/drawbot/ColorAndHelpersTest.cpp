@@ -63,20 +63,14 @@ struct AppData : OpaqueApplicationData {};
 int gCallbackCalls = 0;
 void CountingCallback(ColorDestinationProfile const&, OpaqueApplicationData const&, void*) { ++gCallbackCalls; }
 
-TEST(ColorManagement, ManageCallsTheInstalledCallbackForAManagedVisual) {
-  gCallbackCalls = 0;
-  SetColorManagementCallback(&CountingCallback);
-  boost::intrusive_ptr<ManagedImage> image(new ManagedImage());
-  image->Manage(ImageDestinationProfile(), AppData(), nullptr);
-  EXPECT_EQ(gCallbackCalls, 1);
-  SetColorManagementCallback(nullptr);
-}
-
-TEST(ColorManagement, WithoutACallbackOrForAnUnmanagedVisualManageRaisesTheError) {
+TEST(ColorManagement, AManagedVisualCallsTheCallbackAndWithoutOneOrForAnUnmanagedVisualManageRaises) {
   SetColorManagementCallback(nullptr);
   boost::intrusive_ptr<ManagedImage> managed(new ManagedImage());
   EXPECT_THROW(managed->Manage(ImageDestinationProfile(), AppData(), nullptr), tarsel::config::Exception);
+  gCallbackCalls = 0;
   SetColorManagementCallback(&CountingCallback);
+  managed->Manage(ImageDestinationProfile(), AppData(), nullptr);
+  EXPECT_EQ(gCallbackCalls, 1) << "a managed visual calls the installed callback";
   boost::intrusive_ptr<UnManagedRGBA> plain(new UnManagedRGBA(ColorRGBA(1, 0, 0, 1)));
   try {
     plain->Manage(ColorDestinationProfile(), AppData(), nullptr);
@@ -185,14 +179,7 @@ TEST(ShapeHelpers, ANullSupplierKeepsTheExistingPath) {
   EXPECT_EQ(path.Get(), before);
 }
 
-TEST(ShapeHelpers, ARoundedRectangleWithRadiusZeroIsAPlainRectangle) {
-  RecordingSupplier supplier;
-  PathP path;
-  GetRoundedRectPath(&supplier, RectT<float>(1, 2, 30, 20), 0, &path);
-  EXPECT_EQ(dynamic_cast<RecordingPath const&>(*path).GetDescription(), "R 1 2 30 20");
-}
-
-TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeet) {
+TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeetAndRadiusZeroIsAPlainRectangle) {
   RecordingSupplier supplier;
   PathP path;
   GetRoundedRectPath(&supplier, RectT<float>(0, 0, 40, 10), 8, &path);
@@ -200,6 +187,8 @@ TEST(ShapeHelpers, ARadiusBeyondHalfTheSideMakesTheCornersMeet) {
   // The right side: the top right corner ends where the bottom right one starts.
   EXPECT_EQ(points[4], PointT<float>(40, 5));
   EXPECT_EQ(points[5], PointT<float>(40, 5));
+  GetRoundedRectPath(&supplier, RectT<float>(1, 2, 30, 20), 0, &path);
+  EXPECT_EQ(dynamic_cast<RecordingPath const&>(*path).GetDescription(), "R 1 2 30 20") << "radius zero: a rectangle";
 }
 
 TEST(MemBuffers, RowsAreSixteenByteAlignedAndChannelsSwap) {

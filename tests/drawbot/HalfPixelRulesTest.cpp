@@ -41,47 +41,39 @@ TEST(HalfPixelRules, APaintedRectangleFillsWholePixelsWithFullCoverage) {
   }
 }
 
-TEST(HalfPixelRules, AOnePixelLineOnWholePixelsLightsExactlyOneRowWithAntiAliasingOff) {
-  PixelCanvas canvas(12, 10);
-  PathP path(canvas.GetSupplier());
-  path->MoveTo(PointT<long>(2, 5));
-  path->LineTo(PointT<long>(9, 5));
-  PenP pen(canvas.GetSupplier(), kBlack, 1);
-  canvas.GetSurface()->StrokePath(*pen, *path);
-  auto image = canvas.Snapshot();
-  EXPECT_EQ(RowCoverage(image, 4), "............");
-  EXPECT_EQ(RowCoverage(image, 5).substr(0, 2), "..");
-  EXPECT_EQ(image.Alpha(5, 5), 255);
-  EXPECT_EQ(RowCoverage(image, 6), "............");
-}
-
-TEST(HalfPixelRules, AnAntiAliasedLineAtAWholeNumberStraddlesTwoRowsAtHalfStrength) {
-  PixelCanvas canvas(12, 10);
-  canvas.GetSurface()->SetAntiAliasPolicy(kAntiAlias);
-  PathP path(canvas.GetSupplier());
-  path->MoveTo(PointT<long>(2, 5));
-  path->LineTo(PointT<long>(9, 5));
-  PenP pen(canvas.GetSupplier(), kBlack, 1);
-  canvas.GetSurface()->StrokePath(*pen, *path);
-  auto image = canvas.Snapshot();
-  EXPECT_NEAR(image.Alpha(5, 4), 128, 2);
-  EXPECT_NEAR(image.Alpha(5, 5), 128, 2);
-}
-
-TEST(HalfPixelRules, AFloatPathIsShiftedEvenWithAntiAliasingOff) {
-  // The same line through float points is no longer pixel aligned, so it is
-  // drawn in the shifted frame, half a pixel away from the aligned row.
-  PixelCanvas aligned(12, 10), shifted(12, 10);
-  PenP pen(aligned.GetSupplier(), kBlack, 1);
-  PathP a(aligned.GetSupplier()), f(aligned.GetSupplier());
-  a->MoveTo(PointT<long>(2, 5));
-  a->LineTo(PointT<long>(9, 5));
-  f->MoveTo(PointT<float>(2, 5));
-  f->LineTo(PointT<float>(9, 5));
-  aligned.GetSurface()->StrokePath(*pen, *a);
-  shifted.GetSurface()->StrokePath(*pen, *f);
-  EXPECT_EQ(ColumnCoverage(aligned.Snapshot(), 5), ".....#....");
-  EXPECT_EQ(ColumnCoverage(shifted.Snapshot(), 5), "....#.....");
+// A one-pixel line from (2, 5) to (9, 5): through whole-number points without
+// anti-aliasing it lights row 5 alone; anti-aliased it straddles rows 4 and 5
+// at half strength; through float points it is no longer pixel aligned and is
+// drawn in the shifted frame, half a pixel away, even without anti-aliasing.
+TEST(HalfPixelRules, AOnePixelLineLightsTheRowsItsAlignmentAndPolicyGiveIt) {
+  const struct {
+    const char* name;
+    bool floatPoints;
+    AntiAliasPolicy policy;
+    int alphaRow4, alphaRow5;
+  } cases[] = {
+      {"aligned", false, kAntiAliasNone, 0, 255},
+      {"anti-aliased", false, kAntiAlias, 128, 128},
+      {"float points", true, kAntiAliasNone, 255, 0},
+  };
+  for (const auto& c : cases) {
+    PixelCanvas canvas(12, 10);
+    canvas.GetSurface()->SetAntiAliasPolicy(c.policy);
+    PathP path(canvas.GetSupplier());
+    if (c.floatPoints) {
+      path->MoveTo(PointT<float>(2, 5));
+      path->LineTo(PointT<float>(9, 5));
+    } else {
+      path->MoveTo(PointT<long>(2, 5));
+      path->LineTo(PointT<long>(9, 5));
+    }
+    canvas.GetSurface()->StrokePath(*PenP(canvas.GetSupplier(), kBlack, 1), *path);
+    auto image = canvas.Snapshot();
+    EXPECT_NEAR(image.Alpha(5, 4), c.alphaRow4, 2) << c.name;
+    EXPECT_NEAR(image.Alpha(5, 5), c.alphaRow5, 2) << c.name;
+    EXPECT_EQ(RowCoverage(image, 3), "............") << c.name;
+    EXPECT_EQ(RowCoverage(image, 6), "............") << c.name;
+  }
 }
 
 TEST(HalfPixelRules, StrokeRectOutlinesTheRectangleIncludingItsFarEdge) {

@@ -67,16 +67,6 @@ TEST(PngRoundTrip, UnreadableImagesRaiseTheReadError) {
             "Unable to read image file.");
 }
 
-TEST(BufferImages, StraightBGRAIsPremultipliedForDrawing) {
-  unsigned char pixels[8] = {0, 0, 255, 128, /* */ 255, 0, 0, 255};  // half-transparent red, opaque blue
-  PixelCanvas canvas(2, 1);
-  BufferImageP image(canvas.GetSupplier(), 2, 1, 8, kPixelLayoutBGRA, pixels, nullptr);
-  canvas.GetSurface()->DrawImage(*image, PointT<float>(0, 0), 1);
-  auto shot = canvas.Snapshot();
-  EXPECT_EQ(shot.At(0, 0), 0x80800000u);
-  EXPECT_EQ(shot.At(1, 0), 0xff0000ffu);
-}
-
 TEST(BufferImages, TheDeleterKeepsThePixelsAliveAsLongAsTheImage) {
   static int deleted = 0;
   deleted = 0;
@@ -219,7 +209,13 @@ TEST(SurfaceImages, WithAFlashDelayTheTargetStillEndsWithTheDrawing) {
   cairo_surface_destroy(target);
 }
 
-TEST(BufferImages, PixelsWithoutAlphaAreDrawnOpaque) {
+TEST(BufferImages, StraightBGRAIsPremultipliedAndPixelsWithoutAlphaAreDrawnOpaque) {
+  unsigned char straight[8] = {0, 0, 255, 128, /* */ 255, 0, 0, 255};  // half-transparent red, opaque blue
+  PixelCanvas premultiplied(2, 1);
+  BufferImageP bgra(premultiplied.GetSupplier(), 2, 1, 8, kPixelLayoutBGRA, straight, nullptr);
+  premultiplied.GetSurface()->DrawImage(*bgra, PointT<float>(0, 0), 1);
+  EXPECT_EQ(premultiplied.Snapshot().At(0, 0), 0x80800000u);
+  EXPECT_EQ(premultiplied.Snapshot().At(1, 0), 0xff0000ffu);
   unsigned char pixels[8] = {10, 20, 30, 40, 50, 60, 0, 0};  // B, G, R per pixel, rows of 8 bytes
   PixelCanvas canvas(2, 1);
   BufferImageP image(canvas.GetSupplier(), 2, 1, 8, kPixelLayoutRGB24, pixels, nullptr);

@@ -85,28 +85,31 @@ class Underline : public ::testing::Test {
   PenP pen{&supplier, ColorRGBA(0, 0, 1, 1), 1};
 };
 
-TEST_F(Underline, FromTheFirstCharacterTheLineRunsFromTheOriginThroughTheLastUnderlinedCharacter) {
-  Draw(u"Open", kTextAlignLeft, 0, 0, 1);
-  std::vector<std::string> expected = {"Push", "StrokePath", "DrawString", "Pop"};
-  ASSERT_EQ(supplier.GetOps(), expected);
-  auto const& line = supplier.GetCalls()[1];
-  EXPECT_EQ(line.text, "M 100 22 L 110 22 Z");
-  EXPECT_EQ(line.antiAlias, kAntiAliasNone);
-  EXPECT_EQ(supplier.GetCalls()[2].text, "Open");
-}
-
-TEST_F(Underline, ALaterRangeStartsAtTheWidthOfThePrecedingCharacters) {
-  Draw(u"Save As", kTextAlignLeft, 0, 5, 5);
-  EXPECT_EQ(supplier.GetCalls()[1].text, "M 125 22 L 130 22 Z");
-}
-
-TEST_F(Underline, CentredAndRightAlignedTextMovesTheOriginLeft) {
-  Draw(u"Open", kTextAlignCenter, 0, 0, 0);
-  EXPECT_EQ(supplier.GetCalls()[1].text, "M 90 22 L 95 22 Z");
-  EXPECT_EQ(supplier.GetCalls()[2].point.x, 90);
-  supplier.ClearCalls();
-  Draw(u"Open", kTextAlignRight, 0, 0, 0);
-  EXPECT_EQ(supplier.GetCalls()[2].point.x, 80);
+// The line runs under the underlined characters only (a 10 px recording font
+// is 5 px a character), two pixels below the baseline, and centred or right
+// aligned text moves the origin left. It is drawn first, without anti-aliasing.
+TEST_F(Underline, TheLineRunsUnderTheUnderlinedCharactersFromTheAlignedOrigin) {
+  const struct {
+    const char16_t* text;
+    TextAlignment align;
+    long first, last;
+    const char* line;
+    float textX;
+  } cases[] = {
+      {u"Open", kTextAlignLeft, 0, 1, "M 100 22 L 110 22 Z", 100},
+      {u"Save As", kTextAlignLeft, 5, 5, "M 125 22 L 130 22 Z", 100},
+      {u"Open", kTextAlignCenter, 0, 0, "M 90 22 L 95 22 Z", 90},
+      {u"Open", kTextAlignRight, 0, 0, "M 80 22 L 85 22 Z", 80},
+  };
+  for (const auto& c : cases) {
+    supplier.ClearCalls();
+    Draw(c.text, c.align, 0, c.first, c.last);
+    ASSERT_EQ(supplier.GetOps(), (std::vector<std::string>{"Push", "StrokePath", "DrawString", "Pop"})) << c.line;
+    EXPECT_EQ(supplier.GetCalls()[1].text, c.line);
+    EXPECT_EQ(supplier.GetCalls()[1].antiAlias, kAntiAliasNone) << c.line;
+    EXPECT_EQ(supplier.GetCalls()[2].text, UTF8(c.text)) << c.line;
+    EXPECT_EQ(supplier.GetCalls()[2].point.x, c.textX) << c.line;
+  }
 }
 
 TEST_F(Underline, TheAntiAliasPolicyIsPutBackForTheText) {

@@ -226,17 +226,6 @@ TEST_F(ErrorManagerTest, AnImpossibleSizeFailsAtOnceAndBlockFunctionsMustComeInP
                tarsel::config::Exception);
 }
 
-TEST_F(ErrorManagerTest, RealBlocksAreWritableAndAZeroSizeStillGivesABlock) {
-  auto* block = static_cast<unsigned char*>(mManager->AllocateWithRetries(1000, 3));
-  ASSERT_NE(block, nullptr);
-  std::memset(block, 0xAB, 1000);
-  EXPECT_EQ(block[999], 0xAB);
-  mManager->Deallocate(block);
-  void* empty = mManager->AllocateWithRetries(0, 0);
-  EXPECT_NE(empty, nullptr);
-  mManager->Deallocate(empty);
-}
-
 TEST(Contract, AViolatedContractTracesTheExpressionAndRaisesTheContractErrorAndAKeptOneDoesNothing) {
   tarsel::testing::TraceRecorder trace;
   const long before = tarsel::debug::GetContractViolationCount();

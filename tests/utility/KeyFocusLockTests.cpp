@@ -27,7 +27,13 @@ class KeyFocusLockTest : public ::testing::Test {
   ui::test::FocusableViewP mB;
 };
 
-TEST_F(KeyFocusLockTest, FocusMovedInsideTheLockComesBackAsARestore) {
+TEST_F(KeyFocusLockTest, FocusMovedInsideTheLockComesBackAsARestoreAndWithoutFocusAtTheStartNothingComesBack) {
+  {
+    KeyFocusLock lock;
+    EXPECT_EQ(lock.GetLockedNode(), nullptr);
+    mB->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  }
+  EXPECT_EQ(FocusLeafID(), "b");
   mA->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
   {
     KeyFocusLock lock;
@@ -39,15 +45,6 @@ TEST_F(KeyFocusLockTest, FocusMovedInsideTheLockComesBackAsARestore) {
   EXPECT_EQ(FocusLeafID(), "a");
   EXPECT_TRUE(mA->UI_HasKeyboardFocus(true));
   EXPECT_EQ(mLog, (FocusLog{{"b", ui::kFocusChangeRestore, false}, {"a", ui::kFocusChangeRestore, true}}));
-}
-
-TEST_F(KeyFocusLockTest, WithoutFocusAtTheStartTheLockDoesNothing) {
-  {
-    KeyFocusLock lock;
-    EXPECT_EQ(lock.GetLockedNode(), nullptr);
-    mB->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
-  }
-  EXPECT_EQ(FocusLeafID(), "b");
 }
 
 TEST_F(KeyFocusLockTest, ANodeMovedToAnotherWindowStillTakesFocusBack) {
