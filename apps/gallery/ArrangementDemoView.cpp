@@ -82,6 +82,8 @@ void ArrangementDemoView::MakeSwitches() {
   mCentreHorizontally =
       makeSwitch("$$$/norvik/gallery/Arrange/CentreH=Centre across", "arrangement-centre-h", 4);
   mCentreVertically = makeSwitch("$$$/norvik/gallery/Arrange/CentreV=Centre down", "arrangement-centre-v", 4);
+  // The dividers between the items show from the start.
+  mSeparators->SetChecked(true);
   OnChange(*mTypeGroup, [this] { ApplySwitches(); });
 }
 

@@ -72,12 +72,13 @@ TEST_P(LayoutPageLooks, TheArrangementPicksOtherPlacementsAtOtherWidthsAndFollow
   EXPECT_EQ(tops.size(), wide ? 1u : 12u) << "row or column: a row where it fits, else a column";
   EXPECT_EQ(lefts.size(), wide ? 12u : 1u);
 
-  Click(demo->GetSeparatorSwitch());
   ui::UI_ArrangementView* view = demo->GetArrangementView();
-  ASSERT_EQ(view->SeparatorCount(), 11u);
+  ASSERT_EQ(view->SeparatorCount(), 11u) << "dividers show from the start";
   const ui::HeadlessPixels px = Pixels();
   for (std::size_t i = demo->GetItems().size(); i < view->ChildSize(); ++i)
     EXPECT_GT(Spread(px, On(view->ChildGet(i))), 15) << "separator " << i << " draws its line";
+  Click(demo->GetSeparatorSwitch());
+  EXPECT_EQ(view->ChildSize(), 12u) << "the switch takes the dividers away";
 
   Click(demo->GetCentreHorizontallySwitch());
   lefts = ItemEdges(*demo).first;
