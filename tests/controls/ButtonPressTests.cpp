@@ -56,14 +56,19 @@ TEST_F(ButtonPressTest, ANodeCoveringPartOfTheButtonLiftsThePressLook) {
   EXPECT_TRUE(button->GetDownState());
 }
 
-TEST_F(ButtonPressTest, ReleasingOutsideCancelsAndSendsNoChangedMessage) {
+TEST_F(ButtonPressTest, ReleasingOutsideCancelsSendsNoChangedMessageAndLeavesAToggleAsItWas) {
   log.Listen(*button);
-  Press(PointF(20, 20));
-  Drag(PointF(150, 150));
-  Release(PointF(150, 150));
-  EXPECT_THAT(log.entries, ElementsAre("begin", "cancel"));
-  EXPECT_FALSE(button->GetDownState());
-  EXPECT_FALSE(button->IsChangePending());
+  for (bool toggle : {false, true}) {
+    button->SetSpringLoaded(!toggle);
+    log.entries.clear();
+    Press(PointF(20, 20));
+    Drag(PointF(150, 150));
+    Release(PointF(150, 150));
+    EXPECT_THAT(log.entries, ElementsAre("begin", "cancel")) << toggle;
+    EXPECT_FALSE(button->GetDownState()) << toggle;
+    EXPECT_EQ(button->GetValue(), UI_Button::kButtonOff) << toggle;
+    EXPECT_FALSE(button->IsChangePending()) << toggle;
+  }
 }
 
 TEST_F(ButtonPressTest, AToggleButtonStaysDownAfterOneClickAndComesUpAfterTheNext) {
@@ -78,14 +83,6 @@ TEST_F(ButtonPressTest, AToggleButtonStaysDownAfterOneClickAndComesUpAfterTheNex
   Release(PointF(20, 20));
   EXPECT_EQ(button->GetValue(), UI_Button::kButtonOff);
   EXPECT_THAT(log.entries, ElementsAre("changed", "changed"));
-}
-
-TEST_F(ButtonPressTest, AToggleReleasedOutsideKeepsItsValue) {
-  button->SetSpringLoaded(false);
-  Press(PointF(20, 20));
-  Release(PointF(150, 20));
-  EXPECT_FALSE(button->GetDownState());
-  EXPECT_EQ(button->GetValue(), UI_Button::kButtonOff);
 }
 
 TEST_F(ButtonPressTest, ADisabledButtonIgnoresThePress) {

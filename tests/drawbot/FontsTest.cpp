@@ -49,7 +49,7 @@ TEST(Fonts, AFamilyThatWouldBeSubstitutedIsRefusedAtCreation) {
   }
 }
 
-TEST(Fonts, TheCacheHandsOutOneFontPerFamilyStyleAndSize) {
+TEST(Fonts, TheCacheHandsOutOneFontPerFamilyStyleAndSizeInPixelsAndMetricsFollowIt) {
   SupplierInterface const* supplier = NewOSSupplier();
   FontP a(supplier, u"DejaVu Sans", u"", 12), b(supplier, u"DejaVu Sans", u"Regular", 12);
   FontP bold(supplier, u"DejaVu Sans", u"Bold", 12), larger(supplier, u"DejaVu Sans", u"", 13);
@@ -57,10 +57,7 @@ TEST(Fonts, TheCacheHandsOutOneFontPerFamilyStyleAndSize) {
   EXPECT_NE(a.Get(), bold.Get());
   EXPECT_NE(a.Get(), larger.Get());
   EXPECT_GT(bold->MeasureStringWidth(Chars(u"Timeline"), -1), a->MeasureStringWidth(Chars(u"Timeline"), -1));
-}
-
-TEST(Fonts, SizeIsInPixelsAndMetricsFollowIt) {
-  FontP font(NewOSSupplier(), u"DejaVu Sans", u"", 20);
+  FontP font(supplier, u"DejaVu Sans", u"", 20);
   EXPECT_EQ(font->GetSize(), 20);
   EXPECT_NEAR(font->GetAscent() + font->GetDescent(), 20 * 1.16, 2.0);
   FontP twice(NewOSSupplier(), u"DejaVu Sans", u"", 40);

@@ -44,19 +44,14 @@ class PrefManagerTest : public ::testing::Test {
   ui::HeadlessWindowSystem mSystem;
 };
 
-TEST_F(PrefManagerTest, TheFileLivesInTheToolkitsFolderUnderTheUsersConfiguration) {
-  PrefManager prefs;
-  const std::string path = tarsel::utility::ToStdString(tarsel::utility::UTF16to8(prefs.GetDialogPrefsPath()));
-  EXPECT_EQ(std::filesystem::path(path), mFolder / "norvik" / "NRKDialogPrefs.xml");
-}
-
-TEST_F(PrefManagerTest, AWindowRectangleSurvivesASaveAndALoad) {
+TEST_F(PrefManagerTest, AWindowRectangleSurvivesASaveAndALoadOfTheFileInTheToolkitsFolder) {
   {
     PrefManager prefs;
     prefs.SetWindowPositionAndSize("Export", Rect(1100, 50, 400, 300));
     prefs.SetWindowSize("Levels", Point(200, 100));
     prefs.SaveDialogPrefFile();
   }
+  EXPECT_TRUE(std::filesystem::exists(mFolder / "norvik" / "NRKDialogPrefs.xml")) << "under the user's configuration";
   PrefManager next;
   next.LoadDialogPrefFile();
   Rect rect;

@@ -47,8 +47,18 @@ const char* const kArtwork[] = {
     "SEARCH_STOP_NORMAL", "SEARCH_STOP_NORMAL_D", "SELECTEDTOOLPOPUPMENU", "SP_ADD_SM_N", "SP_ADD_SM_N_D",
     "TABWELL_GRIPPER", "UNCONSTRAINEDPROPORTIONS", "UNLOCKED_SM_N", "UNLOCKED_SM_R", "VERTTOOLBAR-GRIPPER"};
 
-TEST(ModuleResources, NamesAndTypesAreFoundWhateverTheirCase) {
+// Names and types are found whatever their case; a name of another type is
+// not found, and a missing resource raises the text naming it and its type.
+TEST(ModuleResources, NamesAndTypesAreFoundWhateverTheirCaseAndAMissingOneRaisesItsText) {
   OS_ResourceManager resources;
+  EXPECT_FALSE(resources.HasBinary(u"CursorID-26", u"xml"));
+  EXPECT_FALSE(resources.HasBinary(u"NoSuchPicture", u"png"));
+  std::vector<char> bytes{'k', 'e', 'p', 't'};
+  EXPECT_EQ(ErrorOf([&] { resources.GetBinary(u"NoSuchPicture", u"png", &bytes); }),
+            "Unable to access resource 'NoSuchPicture' (type png)");
+  EXPECT_EQ(ErrorOf([&] { resources.GetBinary(u"RV4_Close_Normal", u"jpg", &bytes); }),
+            "Unable to access resource 'RV4_Close_Normal' (type jpg)");
+  EXPECT_EQ(std::string(bytes.begin(), bytes.end()), "kept");
   EXPECT_TRUE(resources.HasBinary(u"RV4_Close_Normal", u"png"));
   EXPECT_TRUE(resources.HasBinary(u"rv4_close_normal", u"PNG"));
   EXPECT_TRUE(resources.HasBinary(u"CursorDataID-26", u"xml"));
@@ -57,23 +67,6 @@ TEST(ModuleResources, NamesAndTypesAreFoundWhateverTheirCase) {
   resources.GetBinary(u"RV4_CLOSE_NORMAL", u"PNG", &upper);
   EXPECT_FALSE(mixed.empty());
   EXPECT_EQ(mixed, upper);
-}
-
-TEST(ModuleResources, ANameOfAnotherTypeIsNotFound) {
-  OS_ResourceManager resources;
-  EXPECT_TRUE(resources.HasBinary(u"CursorID-26", u"png"));
-  EXPECT_FALSE(resources.HasBinary(u"CursorID-26", u"xml"));
-  EXPECT_FALSE(resources.HasBinary(u"NoSuchPicture", u"png"));
-}
-
-TEST(ModuleResources, AMissingResourceRaisesTheTextWithItsNameAndType) {
-  OS_ResourceManager resources;
-  std::vector<char> bytes{'k', 'e', 'p', 't'};
-  EXPECT_EQ(ErrorOf([&] { resources.GetBinary(u"NoSuchPicture", u"png", &bytes); }),
-            "Unable to access resource 'NoSuchPicture' (type png)");
-  EXPECT_EQ(ErrorOf([&] { resources.GetBinary(u"RV4_Close_Normal", u"jpg", &bytes); }),
-            "Unable to access resource 'RV4_Close_Normal' (type jpg)");
-  EXPECT_EQ(std::string(bytes.begin(), bytes.end()), "kept");
 }
 
 // Each named picture decodes at an icon's size, and each themable one has a
