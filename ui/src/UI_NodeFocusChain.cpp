@@ -12,15 +12,16 @@ namespace norvik::ui {
 
 namespace {
 
-// Focus moves at every Tab: the chains of a step live on the stack, and only
-// the two tails (the part of each chain below the common ancestor) and the
-// list of changed nodes reach the heap.
-using Chain = boost::container::small_vector<UI_NodeP, 24>;
+// Focus moves at every Tab: the chains of a step live on the stack, as plain
+// pointers, since nothing is called between building them and taking the
+// tails. Only the tails (the part of each chain below the common ancestor) are
+// called, and only they are held; each hold costs two atomic operations.
+using Chain = boost::container::small_vector<UI_Node*, 24>;
 
 // Root first, inLeaf last.
-Chain StrongChain(UI_Node* inLeaf) {
+Chain ChainOf(UI_Node* inLeaf) {
   Chain chain;
-  for (UI_Node* p = inLeaf; p; p = p->UI_GetParentNode()) chain.emplace_back(p);
+  for (UI_Node* p = inLeaf; p; p = p->UI_GetParentNode()) chain.push_back(p);
   std::reverse(chain.begin(), chain.end());
   return chain;
 }
@@ -82,8 +83,8 @@ bool UI_Node::UI_GainKeyboardFocus(FocusChangeReason inReason) {
     if (old.get() != this) {
       manager->mPreviousKeyboardFocusLeaf = old.get();
       manager->mKeyboardFocusLeaf = this;
-      const Chain oldChain = StrongChain(old.get());
-      const Chain newChain = StrongChain(this);
+      const Chain oldChain = ChainOf(old.get());
+      const Chain newChain = ChainOf(this);
       auto common = std::mismatch(oldChain.begin(), oldChain.end(), newChain.begin(), newChain.end());
       const std::vector<UI_NodeP> oldTail(common.first, oldChain.end());
       const std::vector<UI_NodeP> newTail(common.second, newChain.end());
@@ -117,9 +118,9 @@ void UI_Node::UI_UpdateKeyboardFocusStateDueToLoss() {
     UI_NodeManager::ScUpdatingFocus updating(manager);
     UI_NodeP leaf(manager->mKeyboardFocusLeaf);
     if (leaf && (leaf.get() == this || leaf->UI_IsChildOf(*this))) {
-      const Chain chain = StrongChain(leaf.get());
-      auto self = std::find_if(chain.begin(), chain.end(), [this](const UI_NodeP& n) { return n.get() == this; });
-      manager->mKeyboardFocusLeaf = self == chain.begin() ? nullptr : (self - 1)->get();
+      const Chain chain = ChainOf(leaf.get());
+      auto self = std::find(chain.begin(), chain.end(), this);
+      manager->mKeyboardFocusLeaf = self == chain.begin() ? nullptr : *(self - 1);
       manager->mPreviousKeyboardFocusLeaf = leaf.get();
       std::vector<UI_NodeP> tail(self, chain.end());
       UI_SetKeyboardFocusState(false, tail, leaf.get(), changed, kFocusChangeLoss);
