@@ -146,6 +146,9 @@ inline bool ViewHitTest(const UI_Node& inNode, const PointF& inPoint) {
   return local.width > 0 && local.height > 0 && local.Contains(inPoint);
 }
 
+// How many children ahead a walk over a wide container fetches.
+constexpr std::ptrdiff_t kPrefetchAhead = 8;
+
 // Asks the memory for the lines that the tests above read of inNode: its
 // virtual table pointer and, if it is a view, the fields that follow the
 // node's own (a prefetch of an address past a smaller object is harmless).

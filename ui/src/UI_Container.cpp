@@ -158,8 +158,6 @@ namespace {
 using PointF = tarsel::geom::PointT<float>;
 using Matrix = tarsel::geom::ScaleMatrixT<float>;
 
-constexpr std::ptrdiff_t kPrefetchAhead = 8;
-
 // The point in the child's space when the child covers it; asks the child's
 // own virtual operations when its class overrides any of them.
 bool HitsChild(const UI_Node& inChild, const UI_Node* inScrollingParent, const PointF& inPoint, PointF& outLocal) {
@@ -186,7 +184,7 @@ std::pair<bool, UI_Container::iterator> UI_Container::GetChildHit(bool inRecursi
     UI_Node* child = it->get();
     // A wide container's children do not stay in the cache between two
     // walks; fetching a few ahead overlaps their loads with the tests.
-    if (mChildren.rend() - it > kPrefetchAhead) plainview::Prefetch(*it[kPrefetchAhead]);
+    if (mChildren.rend() - it > plainview::kPrefetchAhead) plainview::Prefetch(*it[plainview::kPrefetchAhead]);
     if (inSkipOSChildren && !plainview::KeepsViewNotNative(*child) && child->UI_ReceivesEventsFromOS()) continue;
     PointF local;
     if (!HitsChild(*child, scrolling, ioPoint, local)) continue;

@@ -207,10 +207,13 @@ bool UI_Node::UI_HandleDrop(const PointF&, datatransfer::OS_ReceiveData*, unsign
 }
 
 void UI_Node::UI_GetOSControlClipRects(OSControlClipRects& ioRects) const {
-  for (const UI_NodeP& child : mChildren) {
+  // The size is read again at each step: a child's overriding code may change the list.
+  for (std::size_t i = 0; i < mChildren.size(); ++i) {
+    if (i + plainview::kPrefetchAhead < mChildren.size()) __builtin_prefetch(mChildren[i + plainview::kPrefetchAhead].get());
     // Every paint asks the whole tree; a leaf that keeps this walk adds nothing.
-    if (child->ChildSize() == 0 && plainview::KeepsNodeClipRects(*child)) continue;
-    child->UI_GetOSControlClipRects(ioRects);
+    const UI_Node& child = *mChildren[i];
+    if (child.ChildSize() == 0 && plainview::KeepsNodeClipRects(child)) continue;
+    child.UI_GetOSControlClipRects(ioRects);
   }
 }
 

@@ -45,6 +45,17 @@ ThemeStamp CurrentThemeStamp(const UI_Node& inNode) {
 // asks again anyway: here it would only double the calls for every child.
 bool MayTouchClip(const UI_Node& inChild, const UI_Node* inScrollingParent, const UI_Node::RectL& inClip) {
   const bool plain = plainview::KeepsViewGeometry(inChild);
+  if (plain && !inScrollingParent && plainview::ViewIsOnlyMoved(inChild)) {
+    // The common case, a view only moved: its rectangle in the parent is
+    // its own, and the margin is three units.
+    const UI_Node::RectF& r = plainview::Fields::Rect(static_cast<const UI_SubView&>(inChild));
+    const double x1 = r.left, x2 = static_cast<double>(r.left) + r.width;
+    const double y1 = r.top, y2 = static_cast<double>(r.top) + r.height;
+    return !(std::min(x1, x2) >= static_cast<double>(inClip.Right()) + 3 ||
+             std::max(x1, x2) <= static_cast<double>(inClip.left) - 3 ||
+             std::min(y1, y2) >= static_cast<double>(inClip.Bottom()) + 3 ||
+             std::max(y1, y2) <= static_cast<double>(inClip.top) - 3);
+  }
   const UI_Node::Matrix m =
       plain ? plainview::ViewStep(inChild, inScrollingParent) : inChild.UI_GetSelfToParentMatrix();
   if (!(std::fabs(m.sx) > kMinimumScale) || !(std::fabs(m.sy) > kMinimumScale)) return false;
@@ -89,7 +100,10 @@ void UI_Node::UI_DispatchDrawToChildren(drawbot::Drawbot* inDrawbot) {
   if (clip.IsEmpty()) return;
   std::vector<UI_NodeP> drawn;
   const UI_Node* scrolling = plainview::ScrollingParent(this);
+  // The size is read again at each step: a child's overriding code may change the list.
   for (std::size_t i = 0; i < mChildren.size(); ++i) {
+    // A wide node's children are not in the cache between two paints.
+    if (i + plainview::kPrefetchAhead < mChildren.size()) plainview::Prefetch(*mChildren[i + plainview::kPrefetchAhead]);
     UI_Node* child = mChildren[i].get();
     if (MayTouchClip(*child, scrolling, clip)) drawn.emplace_back(child);
   }
