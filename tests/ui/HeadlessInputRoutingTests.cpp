@@ -85,58 +85,50 @@ TEST_F(HeadlessInputTest, ADisabledOrHiddenChildLetsThePointerFallToItsParent) {
 
 // ---- clicks ----
 
-std::vector<unsigned> ButtonMessages(const std::vector<RecordedMessage>& inMessages) {
-  std::vector<unsigned> result;
-  for (const RecordedMessage& m : inMessages)
-    if (m.message >= kOSMsgLeftButtonDown && m.message <= kOSMsgMiddleButtonDoubleClick) result.push_back(m.message);
-  return result;
-}
-
-TEST_F(HeadlessInputTest, ASecondQuickClickIsADoubleClickAndAThirdStartsOver) {
-  for (int i = 0; i < 3; ++i) {
-    mSystem.Click(OS_Point(150, 150));
-    mSystem.AdvanceClock(100);
-  }
-  EXPECT_THAT(ButtonMessages(mMessages),
-              ElementsAre(kOSMsgLeftButtonDown, kOSMsgLeftButtonUp, kOSMsgLeftButtonDoubleClick, kOSMsgLeftButtonUp,
-                          kOSMsgLeftButtonDown, kOSMsgLeftButtonUp));
-}
-
-TEST_F(HeadlessInputTest, DoubleClicksComeOnlyToWindowsWhoseClassAsksForThem) {
+// Each row clicks a sequence (button, clock advance before it, point) in a
+// window whose class asks for double clicks, or in one whose class does not.
+TEST_F(HeadlessInputTest, OnlyAQuickNearSecondClickOfTheSameButtonIsADoubleClick) {
+  struct Click {
+    int button;
+    int wait;
+    OS_Point at;
+  };
+  struct Row {
+    const char* name;
+    bool doubleClickClass;
+    std::vector<Click> clicks;
+    std::vector<unsigned> downs;
+  };
+  const OS_Point p(150, 150), q(450, 450);
+  const int left = kHeadlessButtonLeft, right = kHeadlessButtonRight, middle = kHeadlessButtonMiddle;
+  const Row rows[] = {
+      {"a third click starts over", true, {{left, 0, p}, {left, 100, p}, {left, 100, p}},
+       {kOSMsgLeftButtonDown, kOSMsgLeftButtonDoubleClick, kOSMsgLeftButtonDown}},
+      {"slow, then beyond half of the 4-pixel rectangle, then within it", true,
+       {{left, 0, p}, {left, 501, p}, {left, 100, OS_Point(153, 150)}, {left, 100, OS_Point(155, 152)}},
+       {kOSMsgLeftButtonDown, kOSMsgLeftButtonDown, kOSMsgLeftButtonDown, kOSMsgLeftButtonDoubleClick}},
+      {"different buttons", true, {{left, 0, p}, {right, 0, p}, {right, 0, p}, {middle, 0, p}},
+       {kOSMsgLeftButtonDown, kOSMsgRightButtonDown, kOSMsgRightButtonDoubleClick, kOSMsgMiddleButtonDown}},
+      {"a class that does not ask", false, {{left, 0, q}, {left, 0, q}}, {kOSMsgLeftButtonDown, kOSMsgLeftButtonDown}},
+  };
   const OS_WindowHandle plain = MakeWindow(OS_Rect(400, 400, 100, 100), kOSStyleVisible, 0, 0, 0);
-  mSystem.Pump();
-  Clear();
-  mSystem.Click(OS_Point(450, 450));
-  mSystem.Click(OS_Point(450, 450));
-  mSystem.Pump();
-  EXPECT_THAT(ButtonMessages(Messages(kOSMsgLeftButtonDown, plain)),
-              ElementsAre(kOSMsgLeftButtonDown, kOSMsgLeftButtonDown));
-  EXPECT_TRUE(Messages(kOSMsgLeftButtonDoubleClick).empty());
-}
-
-TEST_F(HeadlessInputTest, ASlowOrDistantSecondClickIsNotADoubleClick) {
-  mSystem.Click(OS_Point(150, 150));
-  mSystem.AdvanceClock(501);
-  mSystem.Click(OS_Point(150, 150));
-  mSystem.AdvanceClock(100);
-  mSystem.Click(OS_Point(153, 150));  // beyond half of the 4-pixel rectangle
-  mSystem.AdvanceClock(100);
-  mSystem.Click(OS_Point(155, 152));  // within it
-  mSystem.Pump();
-  EXPECT_EQ(Messages(kOSMsgLeftButtonDown).size(), 3u);
-  EXPECT_EQ(Messages(kOSMsgLeftButtonDoubleClick).size(), 1u);
-}
-
-TEST_F(HeadlessInputTest, DifferentButtonsDoNotMakeADoubleClick) {
-  mSystem.Click(OS_Point(150, 150), kHeadlessButtonLeft);
-  mSystem.Click(OS_Point(150, 150), kHeadlessButtonRight);
-  mSystem.Click(OS_Point(150, 150), kHeadlessButtonRight);
-  mSystem.Click(OS_Point(150, 150), kHeadlessButtonMiddle);
-  mSystem.Pump();
-  EXPECT_THAT(ButtonMessages(mMessages),
-              ElementsAre(kOSMsgLeftButtonDown, kOSMsgLeftButtonUp, kOSMsgRightButtonDown, kOSMsgRightButtonUp,
-                          kOSMsgRightButtonDoubleClick, kOSMsgRightButtonUp, kOSMsgMiddleButtonDown,
-                          kOSMsgMiddleButtonUp));
+  for (const Row& row : rows) {
+    mSystem.AdvanceClock(1000);
+    mSystem.Pump();
+    Clear();
+    for (const Click& c : row.clicks) {
+      mSystem.AdvanceClock(c.wait);
+      mSystem.Click(c.at, c.button);
+    }
+    mSystem.Pump();
+    std::vector<unsigned> downs;
+    for (const RecordedMessage& m : mMessages)
+      if (m.message >= kOSMsgLeftButtonDown && m.message <= kOSMsgMiddleButtonDoubleClick &&
+          m.message != kOSMsgLeftButtonUp && m.message != kOSMsgRightButtonUp && m.message != kOSMsgMiddleButtonUp)
+        downs.push_back(m.message);
+    EXPECT_EQ(downs, row.downs) << row.name;
+    EXPECT_EQ(Messages(kOSMsgLeftButtonDown, plain).size(), row.doubleClickClass ? 0u : 2u) << row.name;
+  }
 }
 
 TEST_F(HeadlessInputTest, AClickInAnInactiveWindowAsksItAndActivatesItWithTheClickCode) {

@@ -26,17 +26,6 @@ class HeadlessTimerTest : public HeadlessFixture {
   OS_WindowHandle mWindow = 0;
 };
 
-TEST_F(HeadlessTimerTest, ATimerFiresAtEachIntervalWithItsIdAndDeadline) {
-  mLayer.SetTimer(mWindow, 7, 100);
-  mSystem.AdvanceClock(250);
-  EXPECT_THAT(Fired(), ElementsAre(std::make_pair(std::uintptr_t(7), OS_EventTime(100)),
-                                   std::make_pair(std::uintptr_t(7), OS_EventTime(200))));
-  EXPECT_EQ(mLayer.GetTickCount(), 250);
-  mSystem.AdvanceClock(50);
-  EXPECT_EQ(Fired().size(), 3u);
-  EXPECT_EQ(Fired().back().second, 300);
-}
-
 TEST_F(HeadlessTimerTest, TimersFireInTheOrderOfTheirDeadlines) {
   mLayer.SetTimer(mWindow, 1, 50);
   mLayer.SetTimer(mWindow, 2, 30);
