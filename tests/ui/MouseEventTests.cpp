@@ -43,17 +43,11 @@ TEST(MouseEventClicks, ContextMenuClickIsASingleRightPress) {
   EXPECT_FALSE(Make(MouseEvent::kActionButtonDown, 1, 1).IsContextMenuClick());
 }
 
-TEST(MouseEventDrag, EndsOnTheReleaseOfTheSamePhysicalButton) {
-  MouseEvent initial = Make(MouseEvent::kActionButtonDown, 1, 1);
-  EXPECT_TRUE(Make(MouseEvent::kActionButtonUp, 1, 1).IsEndDragEvent(initial));
-  EXPECT_FALSE(Make(MouseEvent::kActionButtonUp, 4, 1).IsEndDragEvent(initial));
-  EXPECT_FALSE(Make(MouseEvent::kActionMove, 1, 0).IsEndDragEvent(initial));
-}
-
-TEST(MouseEventDrag, ARewrittenPhysicalButtonDecidesTheEnd) {
-  // The comparison is between physical buttons on both sides, so a rewrite of
-  // the starting event is what the end is matched against.
+TEST(MouseEventDrag, EndsOnTheReleaseOfTheSamePhysicalButtonAsRewrittenOnTheStart) {
   MouseEvent initial = Make(MouseEvent::kActionButtonDown, 4, 1);
+  EXPECT_TRUE(Make(MouseEvent::kActionButtonUp, 4, 1).IsEndDragEvent(initial));
+  EXPECT_FALSE(Make(MouseEvent::kActionButtonUp, 1, 1).IsEndDragEvent(initial));
+  EXPECT_FALSE(Make(MouseEvent::kActionMove, 4, 0).IsEndDragEvent(initial));
   initial.SetPhysicalButton(MouseEvent::kButtonLeft);
   EXPECT_TRUE(Make(MouseEvent::kActionButtonUp, 1, 1).IsEndDragEvent(initial));
   EXPECT_FALSE(Make(MouseEvent::kActionButtonUp, 4, 1).IsEndDragEvent(initial));

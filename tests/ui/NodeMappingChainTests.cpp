@@ -49,18 +49,14 @@ TEST_F(MixedChain, RootAndSpecificParentMatricesEqualTheLevelsComposedOneByOne) 
             Matrix::Translation(8 * 1.5f + 7 * 1.5f, 8 * 2.0f + 7 * 2.0f));
 }
 
-TEST_F(MixedChain, MappingToGlobalAndBackReturnsThePoint) {
-  const PointF local(3.25f, 4.5f);
+TEST_F(MixedChain, MappingToGlobalAndBackReturnsThePointAndTheRecursiveHitFindsTheLeafThere) {
+  const PointF local(0.5f, 0.25f);
   const PointF global = chain.back()->UI_LocalToGlobalF(local);
   EXPECT_EQ(global, ComposedByHand(chain.size() - 1, 0).Transform(local));
   const PointF back = chain.back()->UI_GlobalToLocalF(global);
   EXPECT_NEAR(back.x, local.x, 1e-3);
   EXPECT_NEAR(back.y, local.y, 1e-3);
-}
-
-TEST_F(MixedChain, RecursiveHitFindsTheLeafAtAnyPointMappedFromIt) {
-  const PointF local(0.5f, 0.25f);
-  PointF p = chain.back()->UI_LocalToGlobalF(local);
+  PointF p = global;
   auto hit = chain.front()->GetChildHit(true, false, p);
   ASSERT_TRUE(hit.first);
   EXPECT_EQ(hit.second->get(), chain.back().get());

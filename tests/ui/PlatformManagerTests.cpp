@@ -70,52 +70,38 @@ class PlatformManager : public ::testing::Test {
   bool mInstalled = false;
 };
 
-TEST_F(PlatformManager, WithoutAMakerItHasTheCacheAndSupplierButNoResources) {
+TEST_F(PlatformManager, WithoutAMakerItHasTheCacheAndTheSharedSupplierThatOutlivesItButNoResources) {
   Install(nullptr);
   EXPECT_EQ(NewModuleResourceManager(), nullptr);
-  OS_NodeManager manager;
-  EXPECT_NE(manager.GetDrawbotImageResourceCache(), nullptr);
-  EXPECT_EQ(manager.GetOSDrawSupplier(), drawbot::NewOSSupplier());
-  EXPECT_THROW(manager.GetResourceManager(), tarsel::config::Exception);
+  drawbot::SupplierInterface* shared = nullptr;
+  {
+    OS_NodeManager manager;
+    EXPECT_NE(manager.GetDrawbotImageResourceCache(), nullptr);
+    shared = manager.GetOSDrawSupplier();
+    EXPECT_EQ(shared, drawbot::NewOSSupplier());
+    EXPECT_THROW(manager.GetResourceManager(), tarsel::config::Exception);
+  }
+  OS_NodeManager again;
+  EXPECT_EQ(again.GetOSDrawSupplier(), shared);
+  drawbot::SurfaceP surface(shared, 4, 4);
+  EXPECT_TRUE(static_cast<bool>(surface)) << "still alive and working";
 }
 
-TEST_F(PlatformManager, EachManagerGetsItsOwnResourceManagerFromTheMaker) {
+TEST_F(PlatformManager, EachManagerReadsImagesThroughItsOwnResourceManagerWithThePlatformSupplier) {
   Install(&ProbeResources::Make);
   {
     OS_NodeManager first;
     EXPECT_NE(dynamic_cast<ProbeResources*>(&first.GetResourceManager()), nullptr);
   }
-  OS_NodeManager second;
-  EXPECT_NE(dynamic_cast<ProbeResources*>(&second.GetResourceManager()), nullptr);
-  EXPECT_EQ(ProbeResources::Made(), 2);
-}
-
-TEST_F(PlatformManager, ImagesAreReadThroughTheInstalledResourcesWithThePlatformSupplier) {
-  Install(&ProbeResources::Make);
   OS_NodeManager manager;
+  EXPECT_NE(dynamic_cast<ProbeResources*>(&manager.GetResourceManager()), nullptr);
+  EXPECT_EQ(ProbeResources::Made(), 2);
   // The probe's bytes are no PNG: the platform decoder refuses them, which
   // shows the read went from the cache through the probe to the decoder.
   EXPECT_THROW(manager.GetImage(manager.GetOSDrawSupplier(), "Gripper", drawbot::kImageFileTypePNG),
                tarsel::config::Exception);
   EXPECT_EQ(ProbeResources::Requests(), std::vector<std::string>{"Gripper.png"});
   EXPECT_EQ(manager.GetDrawbotImageResourceCache()->GetSize(), 0u);
-}
-
-TEST_F(PlatformManager, ThePlatformSupplierOutlivesTheManagersThatShareIt) {
-  drawbot::SupplierInterface* shared = nullptr;
-  {
-    OS_NodeManager manager;
-    shared = manager.GetOSDrawSupplier();
-    ASSERT_NE(shared, nullptr);
-  }
-  {
-    OS_NodeManager again;
-    EXPECT_EQ(again.GetOSDrawSupplier(), shared);
-  }
-  // Still alive and working after both managers are gone.
-  EXPECT_EQ(drawbot::NewOSSupplier(), shared);
-  drawbot::SurfaceP surface(shared, 4, 4);
-  EXPECT_TRUE(static_cast<bool>(surface));
 }
 
 }  // namespace

@@ -34,9 +34,10 @@ boost::intrusive_ptr<ClickCountingSubWindowView> AddSubWindowView(UI_Node* inPar
   return view;
 }
 
-TEST_F(SubWindowTest, TheSubWindowIsANativeChildPlacedOverItsView) {
+TEST_F(SubWindowTest, TheSubWindowIsANativeChildOverItsViewShownOnlyWithTheViewAndItsParents) {
   auto window = MakeTopLevel(OS_Rect(100, 100, 400, 300));
-  auto view = AddSubWindowView(window.get(), 30, 40);
+  auto parent = AddView(window.get(), "parent", 0, 0, 300, 200);
+  auto view = AddSubWindowView(parent.get(), 30, 40);
   ASSERT_TRUE(view->GetSubWindow());
   const OS_WindowHandle handle = view->GetSubWindow()->GetHandle();
   ASSERT_NE(handle, 0u);
@@ -45,13 +46,6 @@ TEST_F(SubWindowTest, TheSubWindowIsANativeChildPlacedOverItsView) {
   EXPECT_TRUE(mLayer.IsWindowVisible(handle));
   view->UI_SetLocalRectF(UI_Node::RectF(50, 40, 120, 60));
   EXPECT_EQ(mLayer.GetWindowRect(handle), OS_Rect(150, 140, 120, 60));
-}
-
-TEST_F(SubWindowTest, HidingTheViewOrAParentHidesTheNativeWindow) {
-  auto window = MakeTopLevel(OS_Rect(0, 0, 400, 300));
-  auto parent = AddView(window.get(), "parent", 0, 0, 300, 200);
-  auto view = AddSubWindowView(parent.get(), 30, 40);
-  const OS_WindowHandle handle = view->GetSubWindow()->GetHandle();
   parent->UI_Show(false);
   EXPECT_FALSE(mLayer.IsWindowVisible(handle));
   parent->UI_Show(true);

@@ -31,26 +31,16 @@ class TextEditFocusTest : public ::testing::Test {
   boost::intrusive_ptr<test::FocusableView> mPlain;
 };
 
-TEST_F(TextEditFocusTest, FocusBelowATextFieldCounts) {
+TEST_F(TextEditFocusTest, OnlyFocusBelowARegisteredTextFieldCounts) {
   ASSERT_TRUE(mInner->UI_GainKeyboardFocus(kFocusChangeMouse));
   EXPECT_TRUE(UI_Node::UI_TextEditControlHasFocus());
-}
-
-TEST_F(TextEditFocusTest, FocusOutsideAnyTextFieldDoesNot) {
   ASSERT_TRUE(mPlain->UI_GainKeyboardFocus(kFocusChangeMouse));
-  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus());
-}
-
-TEST_F(TextEditFocusTest, TheFocusLeafItselfIsNotTested) {
+  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus()) << "outside any text field";
   ASSERT_TRUE(mField->UI_GainKeyboardFocus(kFocusChangeMouse));
-  ASSERT_EQ(UI_Node::UI_GetKeyboardFocusLeafNode(), mField.get());
-  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus());
-}
-
-TEST_F(TextEditFocusTest, WithoutARegisteredTestNothingIsATextField) {
+  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus()) << "the focus leaf itself is not tested";
   ASSERT_TRUE(mInner->UI_GainKeyboardFocus(kFocusChangeMouse));
   UI_Node::SetTextEditControlTest(nullptr);
-  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus());
+  EXPECT_FALSE(UI_Node::UI_TextEditControlHasFocus()) << "no registered test";
 }
 
 }  // namespace
