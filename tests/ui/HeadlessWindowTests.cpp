@@ -342,7 +342,7 @@ TEST_F(HeadlessWindowTest, HidingTheActiveWindowActivatesItsOwnerOrTheNextWindow
 
 // ---- focus and capture ----
 
-TEST_F(HeadlessWindowTest, FocusChangesTellBothWindowsAboutEachOther) {
+TEST_F(HeadlessWindowTest, FocusChangesTellBothWindowsAboutEachOtherAndActivateAnInactiveWindow) {
   const OS_WindowHandle window = MakeWindow(OS_Rect(0, 0, 100, 100));
   const OS_WindowHandle a = MakeChild(window, OS_Rect(0, 0, 10, 10));
   const OS_WindowHandle b = MakeChild(window, OS_Rect(20, 0, 10, 10));
@@ -357,18 +357,13 @@ TEST_F(HeadlessWindowTest, FocusChangesTellBothWindowsAboutEachOther) {
   EXPECT_EQ(mMessages[1].message, kOSMsgSetFocus);
   EXPECT_EQ(mMessages[1].wParam, a);
   EXPECT_EQ(mLayer.GetFocus(), b);
-}
-
-TEST_F(HeadlessWindowTest, FocusInAnInactiveWindowActivatesItFirst) {
-  const OS_WindowHandle first = MakeWindow(OS_Rect(0, 0, 100, 100));
-  const OS_WindowHandle field = MakeChild(first, OS_Rect(0, 0, 10, 10));
   MakeWindow(OS_Rect(0, 0, 100, 100));
-  mLayer.SetFocus(field);
-  EXPECT_EQ(mLayer.GetActiveWindow(), first);
-  EXPECT_EQ(mLayer.GetFocus(), field);
+  mLayer.SetFocus(a);
+  EXPECT_EQ(mLayer.GetActiveWindow(), window) << "focus in an inactive window activates it first";
+  EXPECT_EQ(mLayer.GetFocus(), a);
 }
 
-TEST_F(HeadlessWindowTest, TheWindowThatLosesTheCaptureIsTold) {
+TEST_F(HeadlessWindowTest, TheWindowThatLosesTheCaptureIsToldAndADestroyedOneHoldsNothing) {
   const OS_WindowHandle a = MakeWindow(OS_Rect(0, 0, 10, 10));
   const OS_WindowHandle b = MakeWindow(OS_Rect(0, 0, 10, 10));
   mLayer.SetCapture(a);
@@ -381,19 +376,13 @@ TEST_F(HeadlessWindowTest, TheWindowThatLosesTheCaptureIsTold) {
   ASSERT_EQ(Messages(kOSMsgCaptureChanged).size(), 2u);
   EXPECT_EQ(Messages(kOSMsgCaptureChanged)[1].window, b);
   EXPECT_EQ(mLayer.GetCapture(), 0u);
-}
-
-TEST_F(HeadlessWindowTest, DestroyingTheFocusAndCaptureWindowClearsBoth) {
-  const OS_WindowHandle window = MakeWindow(OS_Rect(0, 0, 100, 100));
-  const OS_WindowHandle child = MakeChild(window, OS_Rect(0, 0, 10, 10));
+  const OS_WindowHandle child = MakeChild(a, OS_Rect(0, 0, 5, 5));
   mLayer.SetFocus(child);
   mLayer.SetCapture(child);
   mLayer.DestroyWindow(child);
-  EXPECT_EQ(mLayer.GetFocus(), 0u);
+  EXPECT_EQ(mLayer.GetFocus(), 0u) << "destroying the focus and capture window clears both";
   EXPECT_EQ(mLayer.GetCapture(), 0u);
 }
-
-// ---- monitors, preferences, cursors ----
 
 TEST_F(HeadlessWindowTest, CaretAndOpacityAreRecorded) {
   const OS_WindowHandle window = MakeWindow(OS_Rect(0, 0, 10, 10), kOSStyleVisible, kOSExStyleLayered);
