@@ -14,7 +14,7 @@ PACKAGES=(
   libxkbcommon-dev libxkbcommon-x11-dev
   libx11-dev libgl-dev libglx-dev mesa-common-dev libgl1-mesa-dri
   libgtest-dev libgmock-dev googletest libbenchmark-dev
-  xvfb xdotool xclip x11-utils x11-xkb-utils
+  xvfb xdotool xclip x11-utils x11-xkb-utils openbox wmctrl
   gcovr
 )
 

@@ -57,6 +57,14 @@ struct OS_WindowPlacement {
   OS_Rect normalRect;  // the rectangle of the window when restored, in screen coordinates
 };
 
+// The second parameter of kOSMsgGetMinMaxInfo points at one of these, which
+// the platform fills with its own limits (0: none) before asking: the window
+// answers the smallest and largest client sizes the user may give it.
+struct OS_MinMaxInfo {
+  OS_Point minTrackSize;
+  OS_Point maxTrackSize;
+};
+
 // A region in a window's client coordinates. Regions are the platform's (the
 // Cairo back end's regions on both ports); portable code only combines them
 // through these operations.

@@ -5,14 +5,6 @@
 
 namespace norvik::gallery {
 
-namespace {
-
-// Where the window opens on the desktop when no window manager places it.
-constexpr long kWindowLeft = 60;
-constexpr long kWindowTop = 60;
-
-}  // namespace
-
 GalleryWindow::GalleryWindow(GalleryPageP inPage, long inWidth, long inHeight) : mPage(std::move(inPage)) {
   UI_SetNodeID("gallery-window");
   ui::OS_NativeLayer* layer = ui::GetNativeLayer();
@@ -26,7 +18,9 @@ GalleryWindow::GalleryWindow(GalleryPageP inPage, long inWidth, long inHeight) :
     layer->SetExStyle(handle, layer->GetExStyle(handle) & ~ui::kOSExStyleNoActivate);
   }
   UI_SetTitle(Text("$$$/norvik/gallery/Title=norvik gallery"));
-  UI_SetLocalRect(RectL(kWindowLeft, kWindowTop, inWidth, inHeight));
+  // Only the size: the window manager places the window.
+  const RectF placed = UI_GetLocalRectF(true);
+  UI_SetLocalRect(RectL(static_cast<long>(placed.left), static_cast<long>(placed.top), inWidth, inHeight));
   mPage->UI_Show(true);
   ChildPushBack(mPage);
   // The size message of the rectangle above has laid the page out already;
@@ -41,6 +35,14 @@ GalleryWindow::GalleryWindow(GalleryPageP inPage, long inWidth, long inHeight) :
 int GalleryWindow::Run() {
   ui::OS_NativeLayer* layer = ui::GetNativeLayer();
   return IsOpen() && layer ? layer->RunLoop() : 0;
+}
+
+bool GalleryWindow::UI_DispatchEvent(ui::OS_Event* inEvent) {
+  // Below this size the pages do not fit.
+  if (inEvent->GetMsg() == ui::kOSMsgGetMinMaxInfo && inEvent->GetLParam() != 0)
+    reinterpret_cast<ui::OS_MinMaxInfo*>(inEvent->GetLParam())->minTrackSize =
+        ui::OS_Point(GalleryPage::kMinWidth, GalleryPage::kMinHeight);
+  return OS_TopLevelViewContainer::UI_DispatchEvent(inEvent);
 }
 
 void GalleryWindow::UI_SizeChanged(const RectF& inLocalRect) {

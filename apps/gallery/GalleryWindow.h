@@ -32,6 +32,7 @@ class GalleryWindow : public ui::OS_TopLevelViewContainer {
   // to the platform.
   void SetFirstFrameFunction(std::function<void()> inF) { mFirstFrame = std::move(inF); }
 
+  bool UI_DispatchEvent(ui::OS_Event* inEvent) override;
   void UI_SizeChanged(const RectF& inLocalRect) override;
   bool UI_Paint(ui::OS_Event* inEvent) override;
   void UI_PostClose() override;

@@ -56,9 +56,11 @@ bool OS_Window::UI_DispatchEvent(OS_Event* inEvent) {
       return HandleMouseActivate(inEvent);
     case kOSMsgGetMinMaxInfo:
       // While a structure rectangle is being set it may be larger than the
-      // screen; the platform answers the size asked for through the result.
-      if (mSettingStructureRect <= 0) return true;
-      inEvent->SetResult(MakePointParam(static_cast<int>(mStructureRect.width), static_cast<int>(mStructureRect.height)));
+      // screen.
+      if (mSettingStructureRect <= 0 || inEvent->GetLParam() == 0) return true;
+      reinterpret_cast<OS_MinMaxInfo*>(inEvent->GetLParam())->maxTrackSize =
+          OS_Point(mStructureRect.width, mStructureRect.height);
+      inEvent->SetResult(0);
       return false;
     case kOSMsgKeyDown:
     case kOSMsgKeyUp:

@@ -53,6 +53,10 @@ struct X11Window {
   OS_Rect normalRect;
   bool minimized = false;
   bool maximized = false;
+  bool positioned = false;         // placed by the program, not left to the window manager
+  OS_MinMaxInfo limits;            // the client sizes the user may give it, as the window last said
+  bool viewable = false;           // exposed since it was last mapped
+  bool focusWhenViewable = false;  // activated before it could take the focus
   bool reparented = false;  // a window manager framed it: its configure positions are frame-relative
   OS_CursorHandle cursor = 0;
   std::uint32_t netStates = 0;  // the _NET_WM_STATE changes last told, as bits
@@ -232,6 +236,8 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   std::uint32_t ReadWmState(xcb_window_t inWindow);
   void TranslateUnmap(const xcb_unmap_notify_event_t* inEvent);
   void TranslateMap(const xcb_map_notify_event_t* inEvent);
+  // The first exposure after a map: the window is viewable, and may take the focus.
+  void ExposedFirst(X11Window& ioWindow);
   void NoticeGrabEnd(const xcb_enter_notify_event_t* inEvent);
   // XSETTINGS (X11Settings.cpp)
   void WatchXSettings();
@@ -259,7 +265,10 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   std::intptr_t CallProcedure(OS_WindowHandle inWindow, unsigned inMessage, std::uintptr_t inWParam,
                               std::intptr_t inLParam);
   void SendSize(OS_WindowHandle inWindow);
-  void Configure(X11Window& ioWindow);
+  // Asks the server for the window's size, and for its position when inMove.
+  void Configure(X11Window& ioWindow, bool inMove);
+  // Asks the window for its size limits (kOSMsgGetMinMaxInfo) and publishes them.
+  void UpdateSizeLimits(OS_WindowHandle inWindow);
   // To the top of its siblings, here and on the server.
   void Raise(OS_WindowHandle inWindow);
   // events (X11Events.cpp)
@@ -277,6 +286,16 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   bool ClickActivates(OS_WindowHandle inTarget, unsigned inMessage);
   void NotifyPointerWindow(OS_WindowHandle inWindow);
   void Activate(OS_WindowHandle inTopLevel, int inActivationCode);
+  // To every top level: the application came forward (or went back) as
+  // activation moved from (or to) inOther.
+  void SendActivateApp(bool inActive, OS_WindowHandle inOther);
+  OS_Point PointerOnScreen(xcb_window_t inEventWindow, std::int16_t inX, std::int16_t inY, std::int16_t inRootX,
+                           std::int16_t inRootY) const;
+  // A window manager moving or sizing a top level while the user holds a
+  // button opens a size-move loop; it ends when the buttons come up.
+  void NoticeUserSizeMove(OS_WindowHandle inWindow);
+  void CheckUserSizeMoveEnd();
+  bool PointerButtonsDown();
   bool DeliverOne();
   bool DeliverPaint();
   bool FireDueTimers();
@@ -314,6 +333,9 @@ class OS_NativeLayer_X11 : public OS_NativeLayer {
   std::deque<X11Message> mQueue;
   std::map<std::pair<OS_WindowHandle, std::uintptr_t>, X11Timer> mTimers;
   OS_WindowHandle mActive = 0;
+  bool mApplicationActive = false;  // one of our windows has the activation, or had it last
+  OS_WindowHandle mSizeMoveWindow = 0;
+  std::chrono::steady_clock::time_point mSizeMoveCheck;
   OS_WindowHandle mFocus = 0;
   OS_WindowHandle mCapture = 0;
   unsigned mGrabSequence = 0;  // of the pointer grab that stands for mCapture

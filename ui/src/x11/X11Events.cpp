@@ -105,8 +105,19 @@ bool OS_NativeLayer_X11::ClickActivates(OS_WindowHandle inTarget, unsigned inMes
   return answer != kOSMouseActivateAndEat && answer != kOSMouseNoActivateAndEat && Find(inTarget);
 }
 
+// Where the layer places a pointer event on the screen. Taken from the
+// position inside the window the event came to, so that a window manager's
+// frame, or a screen position the layer has not heard of yet, never shifts
+// the point inside our windows.
+OS_Point OS_NativeLayer_X11::PointerOnScreen(xcb_window_t inEventWindow, std::int16_t inX, std::int16_t inY,
+                                             std::int16_t inRootX, std::int16_t inRootY) const {
+  if (!Find(inEventWindow)) return OS_Point(inRootX, inRootY);
+  return ClientToScreen(inEventWindow, OS_Point(inX, inY));
+}
+
 void OS_NativeLayer_X11::TranslateButton(const xcb_button_press_event_t* inEvent, bool inPress) {
-  const OS_Point screen(inEvent->root_x, inEvent->root_y);
+  const OS_Point screen = PointerOnScreen(inEvent->event, inEvent->event_x, inEvent->event_y, inEvent->root_x,
+                                          inEvent->root_y);
   mPointer = screen;
   mPointerInside = inEvent->same_screen != 0;
   const OS_WindowHandle target = MouseTarget(inEvent->event, screen);
@@ -152,7 +163,8 @@ void OS_NativeLayer_X11::TranslateButton(const xcb_button_press_event_t* inEvent
 }
 
 void OS_NativeLayer_X11::TranslateMotion(const xcb_motion_notify_event_t* inEvent) {
-  const OS_Point screen(inEvent->root_x, inEvent->root_y);
+  const OS_Point screen = PointerOnScreen(inEvent->event, inEvent->event_x, inEvent->event_y, inEvent->root_x,
+                                          inEvent->root_y);
   mPointer = screen;
   mPointerInside = inEvent->same_screen != 0;
   const OS_WindowHandle target = MouseTarget(inEvent->event, screen);
@@ -164,7 +176,8 @@ void OS_NativeLayer_X11::TranslateMotion(const xcb_motion_notify_event_t* inEven
 }
 
 void OS_NativeLayer_X11::TranslateCrossing(const xcb_enter_notify_event_t* inEvent, bool inEnter) {
-  const OS_Point screen(inEvent->root_x, inEvent->root_y);
+  const OS_Point screen = PointerOnScreen(inEvent->event, inEvent->event_x, inEvent->event_y, inEvent->root_x,
+                                          inEvent->root_y);
   mPointer = screen;
   NoticeGrabEnd(inEvent);
   const X11Window* window = Find(inEvent->event);
@@ -188,8 +201,9 @@ void OS_NativeLayer_X11::TranslateFocus(const xcb_focus_in_event_t* inEvent, boo
     Activate(inEvent->event, kOSActivationActive);
     return;
   }
-  if (mActive != inEvent->event) return;
-  // Focus left this top level: deactivate unless it went to another window of ours.
+  // Focus left this top level, or left a window of ours that was hidden while
+  // active: deactivate unless it went to another window of ours.
+  if (mActive != inEvent->event && (mActive != 0 || !mApplicationActive)) return;
   xcb_get_input_focus_reply_t* reply =
       xcb_get_input_focus_reply(mConnection, xcb_get_input_focus(mConnection), nullptr);
   const OS_WindowHandle now = reply ? reply->focus : 0;
@@ -201,13 +215,29 @@ void OS_NativeLayer_X11::TranslateConfigure(const xcb_configure_notify_event_t* 
   X11Window* window = Find(inEvent->window);
   if (!window) return;
   const OS_Rect old = window->rect;
-  if (window->parent != 0 || !window->reparented || (inEvent->response_type & 0x80)) {
+  const bool synthetic = (inEvent->response_type & 0x80) != 0;
+  if (window->parent != 0 || !window->reparented || synthetic) {
     window->rect.left = inEvent->x;
     window->rect.top = inEvent->y;
+  } else {
+    // A real one of a framed window is relative to the frame, and a window
+    // manager that moves and resizes in one step may send no synthetic one
+    // with the screen position: ask the server where the window is now.
+    xcb_translate_coordinates_reply_t* reply = xcb_translate_coordinates_reply(
+        mConnection, xcb_translate_coordinates(mConnection, window->id, mScreen->root, 0, 0), nullptr);
+    window = Find(inEvent->window);
+    if (reply && window) {
+      window->rect.left = reply->dst_x;
+      window->rect.top = reply->dst_y;
+    }
+    std::free(reply);
+    if (!window) return;
   }
   window->rect.width = inEvent->width;
   window->rect.height = inEvent->height;
-  if (window->rect.width != old.width || window->rect.height != old.height) {
+  if (window->parent == 0 && window->rect != old) NoticeUserSizeMove(inEvent->window);
+  X11Window* still = Find(inEvent->window);
+  if (still && (still->rect.width != old.width || still->rect.height != old.height)) {
     SendSize(inEvent->window);
     if (X11Window* sized = Find(inEvent->window)) Damage(*sized, nullptr);
   }
@@ -218,6 +248,11 @@ void OS_NativeLayer_X11::TranslateClientMessage(const xcb_client_message_event_t
   const xcb_atom_t protocol = inEvent->data.data32[0];
   if (protocol == Atom("WM_DELETE_WINDOW")) {
     Queue(inEvent->window, kOSMsgClose, 0, 0, false);
+  } else if (protocol == Atom("WM_TAKE_FOCUS")) {
+    const X11Window* window = Find(inEvent->window);
+    if (window->parent == 0 && (window->exStyle & kOSExStyleNoActivate) == 0 && window->viewable &&
+        IsWindowEnabled(inEvent->window))
+      xcb_set_input_focus(mConnection, XCB_INPUT_FOCUS_PARENT, window->id, inEvent->data.data32[1]);
   } else if (protocol == Atom("_NET_WM_PING")) {
     xcb_client_message_event_t reply = *inEvent;
     reply.window = mScreen->root;
@@ -263,6 +298,7 @@ void OS_NativeLayer_X11::TranslateEvent(xcb_generic_event_t* inEvent) {
       if (window) {
         OS_Rect rect(expose->x, expose->y, expose->width, expose->height);
         Damage(*window, &rect);
+        if (window->id == expose->window) ExposedFirst(*window);
       }
       break;
     }
@@ -368,8 +404,8 @@ int OS_NativeLayer_X11::NextTimeout() const {
   if (!mQueue.empty()) return 0;
   for (const auto& [handle, window] : mWindows)
     if (window->damage) return 0;
-  if (mTimers.empty()) return -1;
-  auto due = mTimers.begin()->second.due;
+  if (mTimers.empty() && mSizeMoveWindow == 0) return -1;
+  auto due = mSizeMoveWindow != 0 ? mSizeMoveCheck : mTimers.begin()->second.due;
   for (const auto& [key, timer] : mTimers) due = std::min(due, timer.due);
   const auto wait = std::chrono::duration_cast<std::chrono::milliseconds>(due - std::chrono::steady_clock::now());
   return static_cast<int>(std::max<long long>(0, wait.count() + 1));
@@ -385,6 +421,7 @@ int OS_NativeLayer_X11::ProcessPendingEvents() {
       ++count;
       continue;
     }
+    CheckUserSizeMoveEnd();
     return count;
   }
 }

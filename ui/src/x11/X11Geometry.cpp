@@ -5,16 +5,22 @@
 
 namespace norvik::ui::x11 {
 
-void OS_NativeLayer_X11::Configure(X11Window& ioWindow) {
+void OS_NativeLayer_X11::Configure(X11Window& ioWindow, bool inMove) {
   // A window manager holds a managed window to its size hints, so they move first.
-  if (ioWindow.parent == 0 && !ioWindow.overrideRedirect) ApplySizeHints(ioWindow);
+  const bool managed = ioWindow.parent == 0 && !ioWindow.overrideRedirect;
+  if (managed) ApplySizeHints(ioWindow);
+  // A position asked of a window manager places the frame, not the client
+  // area: asked again with each size change, it would creep by the frame.
   const std::uint32_t values[] = {static_cast<std::uint32_t>(static_cast<std::int32_t>(ioWindow.rect.left)),
                                   static_cast<std::uint32_t>(static_cast<std::int32_t>(ioWindow.rect.top)),
                                   static_cast<std::uint32_t>(std::max<long>(1, ioWindow.rect.width)),
                                   static_cast<std::uint32_t>(std::max<long>(1, ioWindow.rect.height))};
-  xcb_configure_window(mConnection, ioWindow.id,
-                       XCB_CONFIG_WINDOW_X | XCB_CONFIG_WINDOW_Y | XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT,
-                       values);
+  if (inMove || !managed)
+    xcb_configure_window(mConnection, ioWindow.id,
+                         XCB_CONFIG_WINDOW_X | XCB_CONFIG_WINDOW_Y | XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT,
+                         values);
+  else
+    xcb_configure_window(mConnection, ioWindow.id, XCB_CONFIG_WINDOW_WIDTH | XCB_CONFIG_WINDOW_HEIGHT, values + 2);
 }
 
 void OS_NativeLayer_X11::ShowWindow(OS_WindowHandle inWindow, int inShowCommand) {
@@ -60,7 +66,7 @@ void OS_NativeLayer_X11::ShowWindow(OS_WindowHandle inWindow, int inShowCommand)
       std::vector<OS_Monitor> monitors = GetMonitors();
       if (!monitors.empty()) window->rect = monitors.front().workArea;
       ApplyWindowState(*window);
-      Configure(*window);
+      Configure(*window, true);
       window->style |= kOSStyleVisible;
       xcb_map_window(mConnection, window->id);
       SendSize(inWindow);
@@ -74,11 +80,14 @@ void OS_NativeLayer_X11::ShowWindow(OS_WindowHandle inWindow, int inShowCommand)
         window->minimized = window->maximized = false;
         if (wasMaximized) window->rect = window->normalRect;
         ApplyWindowState(*window);
-        Configure(*window);
+        Configure(*window, window->positioned);
         SendSize(inWindow);
       }
       [[fallthrough]];
     default:
+      if (!wasVisible) UpdateSizeLimits(inWindow);
+      window = Find(inWindow);
+      if (!window) return;
       window->style |= kOSStyleVisible;
       // A popup that bypasses the window manager opens above everything
       // else, even above windows made after it.
@@ -127,15 +136,16 @@ void OS_NativeLayer_X11::SetWindowPos(OS_WindowHandle inWindow, OS_WindowHandle 
   X11Window* window = Find(inWindow);
   if (!window) return;
   const OS_Rect old = window->rect;
-  if ((inFlags & kOSPosNoMove) == 0) {
+  if ((inFlags & kOSPosNoMove) == 0 && (inRect.left != old.left || inRect.top != old.top)) {
     window->rect.left = inRect.left;
     window->rect.top = inRect.top;
+    window->positioned = true;
   }
   if ((inFlags & kOSPosNoSize) == 0) {
     window->rect.width = std::max<long>(0, inRect.width);
     window->rect.height = std::max<long>(0, inRect.height);
   }
-  if (window->rect != old) Configure(*window);
+  if (window->rect != old) Configure(*window, window->rect.left != old.left || window->rect.top != old.top);
   if ((inFlags & kOSPosNoZOrder) == 0) {
     auto& siblings = SiblingsOf(*window);
     siblings.erase(std::remove(siblings.begin(), siblings.end(), inWindow), siblings.end());
@@ -226,11 +236,17 @@ OS_WindowHandle OS_NativeLayer_X11::WindowFromPoint(OS_Point inScreenPoint) cons
 
 // Activation moves between top levels: the old one hears it is inactive, the
 // new one that it is active, and (through the default handling) the new one
-// takes the keyboard focus unless the focus already lies inside it.
+// takes the keyboard focus unless the focus already lies inside it. When it
+// comes from or goes to a window of another client, every top level first
+// hears that the application as a whole came forward or went back, which is
+// what keeps the focus inside a window over a visit elsewhere.
 void OS_NativeLayer_X11::Activate(OS_WindowHandle inTopLevel, int inActivationCode) {
-  if (inTopLevel == mActive) return;
+  if (inTopLevel == mActive && (inTopLevel != 0 || !mApplicationActive)) return;
   const OS_WindowHandle old = mActive;
   mActive = inTopLevel;
+  const bool applicationChanges = mApplicationActive != (inTopLevel != 0);
+  mApplicationActive = inTopLevel != 0;
+  if (applicationChanges && inTopLevel == 0) SendActivateApp(false, 0);
   if (old != 0 && Find(old)) CallProcedure(old, kOSMsgActivate, kOSActivationInactive, static_cast<std::intptr_t>(inTopLevel));
   if (inTopLevel == 0) {
     if (mFocus != 0) {
@@ -240,9 +256,18 @@ void OS_NativeLayer_X11::Activate(OS_WindowHandle inTopLevel, int inActivationCo
     }
     return;
   }
+  if (applicationChanges) SendActivateApp(true, old);
   if (mActive != inTopLevel || !Find(inTopLevel)) return;
   CallProcedure(inTopLevel, kOSMsgActivate, static_cast<std::uintptr_t>(inActivationCode),
                 static_cast<std::intptr_t>(old));
+}
+
+void OS_NativeLayer_X11::SendActivateApp(bool inActive, OS_WindowHandle inOther) {
+  std::vector<OS_WindowHandle> topLevels;
+  for (OS_WindowHandle handle : mStacking)
+    if (const X11Window* window = Find(handle); window && !window->destroying) topLevels.push_back(handle);
+  for (OS_WindowHandle handle : topLevels)
+    if (Find(handle)) CallProcedure(handle, kOSMsgActivateApp, inActive ? 1 : 0, static_cast<std::intptr_t>(inOther));
 }
 
 void OS_NativeLayer_X11::SetActiveWindow(OS_WindowHandle inWindow) {
@@ -250,7 +275,13 @@ void OS_NativeLayer_X11::SetActiveWindow(OS_WindowHandle inWindow) {
   X11Window* window = Find(top);
   if (!window || top == mActive || window->overrideRedirect || (window->exStyle & kOSExStyleNoActivate)) return;
   if (IsWindowVisible(top)) {
-    xcb_set_input_focus(mConnection, XCB_INPUT_FOCUS_PARENT, window->id, XCB_CURRENT_TIME);
+    // The server refuses the focus to a window that is not viewable yet (a
+    // window manager maps it some time after our request): then it follows
+    // the first exposure.
+    if (window->viewable)
+      xcb_set_input_focus(mConnection, XCB_INPUT_FOCUS_PARENT, window->id, XCB_CURRENT_TIME);
+    else
+      window->focusWhenViewable = true;
     xcb_client_message_event_t message{};
     message.response_type = XCB_CLIENT_MESSAGE;
     message.format = 32;

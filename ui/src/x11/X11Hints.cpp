@@ -7,6 +7,7 @@
 #include <xcb/xcb_icccm.h>
 
 #include <algorithm>
+#include <cstring>
 #include <vector>
 
 #include "ui/src/x11/OS_NativeLayer_X11.h"
@@ -44,10 +45,19 @@ void OS_NativeLayer_X11::UpdateTopLevelKind(X11Window& ioWindow) {
 
 void OS_NativeLayer_X11::ApplyTopLevelHints(X11Window& ioWindow) {
   const xcb_window_t id = ioWindow.id;
-  xcb_atom_t protocols[] = {Atom("WM_DELETE_WINDOW"), Atom("_NET_WM_PING")};
-  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("WM_PROTOCOLS"), XCB_ATOM_ATOM, 32, 2, protocols);
+  // A window that takes the focus is locally active in ICCCM's terms: the
+  // window manager offers the focus with WM_TAKE_FOCUS and we take it.
+  std::vector<xcb_atom_t> protocols{Atom("WM_DELETE_WINDOW"), Atom("_NET_WM_PING")};
+  if ((ioWindow.exStyle & kOSExStyleNoActivate) == 0) protocols.push_back(Atom("WM_TAKE_FOCUS"));
+  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("WM_PROTOCOLS"), XCB_ATOM_ATOM, 32,
+                      static_cast<std::uint32_t>(protocols.size()), protocols.data());
+  // The process id means something only together with the machine it runs on.
   std::uint32_t pid = static_cast<std::uint32_t>(getpid());
   xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, Atom("_NET_WM_PID"), XCB_ATOM_CARDINAL, 32, 1, &pid);
+  char host[256] = {};
+  if (gethostname(host, sizeof(host) - 1) == 0)
+    xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, XCB_ATOM_WM_CLIENT_MACHINE, XCB_ATOM_STRING, 8,
+                        static_cast<std::uint32_t>(std::strlen(host)), host);
   if (ioWindow.owner != 0) {
     xcb_window_t owner = static_cast<xcb_window_t>(ioWindow.owner);
     xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, XCB_ATOM_WM_TRANSIENT_FOR, XCB_ATOM_WINDOW, 32, 1,
@@ -132,8 +142,9 @@ void OS_NativeLayer_X11::RequestStateChanges(X11Window& ioWindow) {
 }
 
 // WM_HINTS: whether the window manager may give the window the keyboard
-// focus. WM_NORMAL_HINTS: the position and size were asked for by the
-// program, and a window without a sizing frame keeps its size.
+// focus. WM_NORMAL_HINTS: the position when the program placed the window
+// (else the window manager places it), the limits of its size, and that a
+// window without a sizing frame keeps its size.
 void OS_NativeLayer_X11::ApplyIcccmHints(X11Window& ioWindow) {
   xcb_icccm_wm_hints_t hints{};
   xcb_icccm_wm_hints_set_input(&hints, (ioWindow.exStyle & kOSExStyleNoActivate) == 0 ? 1 : 0);
@@ -144,8 +155,9 @@ void OS_NativeLayer_X11::ApplyIcccmHints(X11Window& ioWindow) {
 
 void OS_NativeLayer_X11::ApplySizeHints(X11Window& ioWindow) {
   xcb_size_hints_t size{};
-  xcb_icccm_size_hints_set_position(&size, 0, static_cast<int32_t>(ioWindow.rect.left),
-                                    static_cast<int32_t>(ioWindow.rect.top));
+  if (ioWindow.positioned)
+    xcb_icccm_size_hints_set_position(&size, 0, static_cast<int32_t>(ioWindow.rect.left),
+                                      static_cast<int32_t>(ioWindow.rect.top));
   const auto width = static_cast<int32_t>(std::max<long>(1, ioWindow.rect.width));
   const auto height = static_cast<int32_t>(std::max<long>(1, ioWindow.rect.height));
   xcb_icccm_size_hints_set_size(&size, 0, width, height);
@@ -153,9 +165,34 @@ void OS_NativeLayer_X11::ApplySizeHints(X11Window& ioWindow) {
   if (framed && (ioWindow.style & kOSStyleThickFrame) == 0 && !ioWindow.maximized) {
     xcb_icccm_size_hints_set_min_size(&size, width, height);
     xcb_icccm_size_hints_set_max_size(&size, width, height);
+  } else {
+    const OS_MinMaxInfo& limits = ioWindow.limits;
+    if (limits.minTrackSize.x > 0 || limits.minTrackSize.y > 0)
+      xcb_icccm_size_hints_set_min_size(&size, static_cast<int32_t>(std::max<long>(1, limits.minTrackSize.x)),
+                                        static_cast<int32_t>(std::max<long>(1, limits.minTrackSize.y)));
+    if (limits.maxTrackSize.x > 0 || limits.maxTrackSize.y > 0)
+      xcb_icccm_size_hints_set_max_size(
+          &size, static_cast<int32_t>(limits.maxTrackSize.x > 0 ? limits.maxTrackSize.x : 32767),
+          static_cast<int32_t>(limits.maxTrackSize.y > 0 ? limits.maxTrackSize.y : 32767));
   }
   xcb_icccm_size_hints_set_win_gravity(&size, XCB_GRAVITY_NORTH_WEST);
   xcb_icccm_set_wm_normal_hints(mConnection, ioWindow.id, &size);
+}
+
+// Asked when the window is shown rather than with each change of its
+// rectangle: while a rectangle is being set, the window answers a limit for
+// that change only.
+void OS_NativeLayer_X11::UpdateSizeLimits(OS_WindowHandle inWindow) {
+  X11Window* window = Find(inWindow);
+  if (!window || window->parent != 0 || window->overrideRedirect) return;
+  OS_MinMaxInfo limits;
+  CallProcedure(inWindow, kOSMsgGetMinMaxInfo, 0, reinterpret_cast<std::intptr_t>(&limits));
+  window = Find(inWindow);
+  if (!window) return;
+  const bool changed = !(limits.minTrackSize == window->limits.minTrackSize) ||
+                       !(limits.maxTrackSize == window->limits.maxTrackSize);
+  window->limits = limits;
+  if (changed) ApplySizeHints(*window);
 }
 
 }  // namespace norvik::ui::x11

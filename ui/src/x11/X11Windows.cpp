@@ -4,15 +4,14 @@
 #include <cstring>
 
 #include "tarsel/ErrorManager.h"
+#include "ui/ApplicationIdentity.h"
 #include "ui/OS_DefaultWindowProcedure.h"
 #include "ui/src/x11/OS_NativeLayer_X11.h"
 
 namespace norvik::ui::x11 {
 namespace {
 
-const char kClassName[] = "TolliverLord - Window Class";
 const char16_t kClassName16[] = u"TolliverLord - Window Class";
-const char kNodeProperty[] = "norvik::ui::OS_Window::property";
 
 constexpr std::uint32_t kEventMask =
     XCB_EVENT_MASK_EXPOSURE | XCB_EVENT_MASK_STRUCTURE_NOTIFY | XCB_EVENT_MASK_KEY_PRESS |
@@ -76,6 +75,7 @@ OS_WindowHandle OS_NativeLayer_X11::CreateWindow(const OS_WindowCreateParams& in
   window->owner = isChild ? 0 : inParams.parent;
   window->rect = inParams.rect;
   window->normalRect = inParams.rect;
+  window->positioned = inParams.rect.left != 0 || inParams.rect.top != 0;
   window->overrideRedirect = !isChild && BypassesWindowManager(inParams.style, inParams.exStyle);
 
   const std::uint32_t mask = XCB_CW_BACK_PIXMAP | XCB_CW_BIT_GRAVITY | XCB_CW_OVERRIDE_REDIRECT | XCB_CW_EVENT_MASK;
@@ -97,8 +97,11 @@ OS_WindowHandle OS_NativeLayer_X11::CreateWindow(const OS_WindowCreateParams& in
   mWindows[handle] = std::move(window);
   SiblingsOf(ref).insert(SiblingsOf(ref).begin(), handle);
 
+  // Desktops match the application's windows by instance and class name.
+  std::string wmClass = GetApplicationInstanceName();
+  wmClass.append(1, '\0').append(GetApplicationClassName()).append(1, '\0');
   xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, id, XCB_ATOM_WM_CLASS, XCB_ATOM_STRING, 8,
-                      sizeof(kClassName) * 2, std::string(kClassName, sizeof(kClassName)).append(kClassName, sizeof(kClassName)).data());
+                      static_cast<std::uint32_t>(wmClass.size()), wmClass.data());
   if (!isChild) ApplyTopLevelHints(ref);
   SetWindowText(handle, inParams.title);
 
@@ -161,6 +164,10 @@ void OS_NativeLayer_X11::ForgetDestroyedWindow(OS_WindowHandle inWindow) {
     if (mFocus == h) mFocus = 0;
     if (mPointerWindow == h) mPointerWindow = 0;
   }
+  if (mSizeMoveWindow == inWindow) {
+    mSizeMoveWindow = 0;
+    CallProcedure(inWindow, kOSMsgExitSizeMove, 0, 0);
+  }
   if (mActive == inWindow) {
     CallProcedure(inWindow, kOSMsgActivate, kOSActivationInactive, 0);
     mActive = 0;
@@ -191,13 +198,8 @@ UTF16String OS_NativeLayer_X11::GetClassName(OS_WindowHandle inWindow) const {
 void OS_NativeLayer_X11::SetProperty(OS_WindowHandle inWindow, const std::string& inName, void* inValue) {
   X11Window* window = Find(inWindow);
   if (!window) return;
+  // Kept here only: a handle to a node means nothing to other clients.
   window->properties[inName] = inValue;
-  if (inName == kNodeProperty) {
-    // Marks the window as the toolkit's for other clients too.
-    std::uint32_t marker = 1;
-    xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, window->id, Atom(kNodeProperty), XCB_ATOM_CARDINAL, 32, 1,
-                        &marker);
-  }
 }
 
 void* OS_NativeLayer_X11::GetProperty(OS_WindowHandle inWindow, const std::string& inName) const {
@@ -211,7 +213,6 @@ void OS_NativeLayer_X11::RemoveProperty(OS_WindowHandle inWindow, const std::str
   X11Window* window = Find(inWindow);
   if (!window) return;
   window->properties.erase(inName);
-  if (inName == kNodeProperty) xcb_delete_property(mConnection, window->id, Atom(kNodeProperty));
 }
 
 void OS_NativeLayer_X11::SetWindowText(OS_WindowHandle inWindow, const UTF16String& inText) {
@@ -222,6 +223,12 @@ void OS_NativeLayer_X11::SetWindowText(OS_WindowHandle inWindow, const UTF16Stri
   xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, window->id, Atom("_NET_WM_NAME"), Atom("UTF8_STRING"), 8,
                       static_cast<std::uint32_t>(utf8.size()), utf8.data());
   xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, window->id, XCB_ATOM_WM_NAME, XCB_ATOM_STRING, 8,
+                      static_cast<std::uint32_t>(utf8.size()), utf8.data());
+  if (window->parent != 0) return;
+  // Task bars name an iconified window by its icon name.
+  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, window->id, Atom("_NET_WM_ICON_NAME"), Atom("UTF8_STRING"),
+                      8, static_cast<std::uint32_t>(utf8.size()), utf8.data());
+  xcb_change_property(mConnection, XCB_PROP_MODE_REPLACE, window->id, XCB_ATOM_WM_ICON_NAME, XCB_ATOM_STRING, 8,
                       static_cast<std::uint32_t>(utf8.size()), utf8.data());
 }
 

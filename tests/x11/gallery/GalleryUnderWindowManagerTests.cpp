@@ -1,0 +1,163 @@
+// The gallery under a real window manager (openbox, started on the test's
+// Xvfb): frames that make configure events frame-relative, the user dragging
+// a frame, focus going to another client and back, size hints held to, and
+// no X error from any of it.
+#include <signal.h>
+#include <sys/wait.h>
+#include <unistd.h>
+#include <xcb/xcb_icccm.h>
+
+#include <cstdio>
+#include <cstring>
+
+#include "ControlsView.h"
+#include "GalleryWindow.h"
+#include "controls/UI_Checkbox.h"
+#include "support/ui/XvfbServer.h"
+#include "tarsel/ErrorManager.h"
+#include "ui/OS_NodeManager.h"
+#include "ui/Theme.h"
+#include "x11/X11Fixture.h"
+
+namespace norvik::test {
+namespace {
+
+struct CountingWindow : gallery::GalleryWindow {
+  using GalleryWindow::GalleryWindow;
+  void UI_SizeChanged(const RectF& inRect) override { ++mSizeChanges, GalleryWindow::UI_SizeChanged(inRect); }
+  int mSizeChanges = 0;
+};
+
+class GalleryUnderWindowManager : public X11Fixture {
+ protected:
+  void SetUp() override {
+    X11Fixture::SetUp();
+    if (IsSkipped() || HasFatalFailure()) return;
+    if (access("/usr/bin/openbox", X_OK) != 0) GTEST_SKIP() << "openbox is not installed (scripts/install-deps.sh)";
+    if ((mWindowManager = fork()) == 0) {
+      std::freopen("/dev/null", "w", stderr), std::freopen("/dev/null", "w", stdout);
+      setenv("DISPLAY", XvfbServer::Get()->GetDisplayName().c_str(), 1);
+      execl("/usr/bin/openbox", "openbox", "--sm-disable", static_cast<char*>(nullptr));
+      _exit(127);
+    }
+    ASSERT_TRUE(WaitFor([&] { return !Read(mXTest->GetRoot(), "_NET_SUPPORTING_WM_CHECK").empty(); }, 10000));
+    tarsel::config::ErrorManager::Get(true)->SetReportHandler([this](const auto&) { ++mXErrors; });
+    ui::InstallNativeLayer(mLayer.get());
+    const ui::KeyframeThemeEditorP theme = ui::MakeDefaultKeyframeTheme();
+    ui::Theme::Initialize(theme);
+    mPage.reset(new gallery::GalleryPage(theme, false));
+    mWindow.reset(new CountingWindow(mPage, 900, 640));
+    ASSERT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == Handle() && mWindow->UI_IsShown(); }));
+    Settle(400);  // the window manager's own focus changes after mapping
+  }
+  void TearDown() override {
+    mWindow.reset();
+    mPage.reset();
+    if (mWindowManager > 0) {
+      Settle(100);
+      EXPECT_EQ(mXErrors, 0) << "X errors from start, the test and closing";
+      ui::InstallNativeLayer(nullptr);
+      ui::Theme::Terminate();
+      tarsel::config::ErrorManager::Get(true)->SetReportHandler(nullptr);
+      kill(mWindowManager, SIGTERM);
+      waitpid(mWindowManager, nullptr, 0);
+    }
+    X11Fixture::TearDown();
+  }
+  xcb_window_t Handle() const { return static_cast<xcb_window_t>(mWindow->GetHandle()); }
+  xcb_atom_t Atom(const char* inName) {
+    auto* reply = xcb_intern_atom_reply(mUser, xcb_intern_atom(mUser, 0, std::strlen(inName), inName), nullptr);
+    const xcb_atom_t atom = reply ? reply->atom : 0;
+    std::free(reply);
+    return atom;
+  }
+  std::string Read(xcb_window_t inWindow, const char* inName) {
+    auto* reply = xcb_get_property_reply(
+        mUser, xcb_get_property(mUser, 0, inWindow, Atom(inName), XCB_ATOM_ANY, 0, 64), nullptr);
+    std::string value(reply ? static_cast<const char*>(xcb_get_property_value(reply)) : "",
+                      reply ? xcb_get_property_value_length(reply) : 0);
+    std::free(reply);
+    return value;
+  }
+  // What pagers and wmctrl send the window manager.
+  void Ask(const char* inType, std::initializer_list<std::uint32_t> inData, xcb_window_t inWindow = 0) {
+    xcb_client_message_event_t message{XCB_CLIENT_MESSAGE, 32, 0, inWindow ? inWindow : Handle(), Atom(inType), {}};
+    std::copy(inData.begin(), inData.end(), message.data.data32);
+    xcb_send_event(mUser, 0, mXTest->GetRoot(), XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT,
+                   reinterpret_cast<const char*>(&message));
+    xcb_flush(mUser);
+  }
+  ui::OS_Point ServerOrigin() {
+    auto* reply = xcb_translate_coordinates_reply(
+        mUser, xcb_translate_coordinates(mUser, Handle(), mXTest->GetRoot(), 0, 0), nullptr);
+    const ui::OS_Point origin(reply ? reply->dst_x : -1, reply ? reply->dst_y : -1);
+    std::free(reply);
+    return origin;
+  }
+
+  pid_t mWindowManager = -1;
+  int mXErrors = 0;
+  ui::OS_NodeManager mManager;
+  gallery::GalleryPageP mPage;
+  boost::intrusive_ptr<CountingWindow> mWindow;
+};
+
+TEST_F(GalleryUnderWindowManager, AfterAMoveAndResizeInOneStepClicksStillReachTheirControls) {
+  xcb_size_hints_t hints{};
+  ASSERT_TRUE(xcb_icccm_get_wm_normal_hints_reply(mUser, xcb_icccm_get_wm_normal_hints(mUser, Handle()), &hints, 0));
+  EXPECT_EQ(hints.min_width * 10000 + hints.min_height, 560 * 10000 + 420) << "the smallest size the pages fit";
+  EXPECT_FALSE(hints.flags & (XCB_ICCCM_SIZE_HINT_US_POSITION | XCB_ICCCM_SIZE_HINT_P_POSITION));
+  Ask("_NET_MOVERESIZE_WINDOW", {0xF00 | (2u << 12), 200, 150, 820, 600});  // as wmctrl -e does
+  ASSERT_TRUE(WaitFor([&] { return mWindow->UI_GetLocalRect().width == 820; }));
+  Settle(150);
+  EXPECT_EQ(mLayer->ClientToScreen(Handle(), ui::OS_Point(0, 0)), ServerOrigin());
+  auto* controls = static_cast<gallery::ControlsView*>(mPage->GetSection("section-controls")->UI_ChildGetFromID("controls"));
+  controls::UI_Checkbox* snap = controls->GetSnapCheckbox();
+  const ui::UI_Node::RectL box = snap->UI_LocalToGlobal(ui::UI_Node::RectL(0, 0, 10, 10));
+  const ui::OS_Point layer = mLayer->ClientToScreen(Handle(), ui::OS_Point(0, 0)), server = ServerOrigin();
+  MovePointer(box.left + 5 - layer.x + server.x, box.top + 5 - layer.y + server.y);
+  const bool before = snap->IsChecked();
+  Button(1, true);
+  Button(1, false);
+  EXPECT_TRUE(WaitFor([&] { return snap->IsChecked() != before; })) << "the click missed the checkbox";
+}
+
+TEST_F(GalleryUnderWindowManager, FocusInsideTheWindowComesBackWhenActivationReturnsFromAnotherClient) {
+  const std::vector<ui::UI_Node*> tiles = mPage->GetFocusTiles();
+  tiles[2]->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  const xcb_window_t other = xcb_generate_id(mUser);
+  xcb_create_window(mUser, 0, other, mXTest->GetRoot(), 600, 500, 300, 200, 0, XCB_WINDOW_CLASS_INPUT_OUTPUT,
+                    XCB_COPY_FROM_PARENT, 0, nullptr);
+  xcb_map_window(mUser, other);
+  Ask("_NET_ACTIVE_WINDOW", {2}, other);
+  ASSERT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == 0; })) << "the other client never took the focus";
+  EXPECT_FALSE(mManager.IsApplicationFrontmost());
+  Ask("_NET_ACTIVE_WINDOW", {2});
+  EXPECT_TRUE(WaitFor([&] { return tiles[2]->UI_HasKeyboardFocus(true); })) << "the tile lost its focus";
+  Key(0xFF09, true);  // Tab goes on from there rather than from the first stop
+  Key(0xFF09, false);
+  EXPECT_TRUE(WaitFor([&] { return tiles[3]->UI_HasKeyboardFocus(true); }));
+}
+
+TEST_F(GalleryUnderWindowManager, DraggingTheFramesGripIsOneSizeMoveLoopAndRestoringAfterIconifyChangesNoSize) {
+  const ui::OS_Point origin = ServerOrigin();
+  const ui::UI_Node::RectL client = mWindow->UI_GetLocalRect();
+  const int x = origin.x + client.width - 4, y = origin.y + client.height + 3;  // bottom right grip
+  MovePointer(x, y);
+  Button(1, true);
+  for (int step = 1; step <= 6; ++step) MovePointer(x + 10 * step, y + 5 * step), Settle(40);
+  EXPECT_TRUE(WaitFor([&] { return mManager.IsUserResizing(); })) << "no size-move loop while dragging";
+  Button(1, false);
+  EXPECT_TRUE(WaitFor([&] { return !mManager.IsUserResizing(); }));
+  EXPECT_EQ(mWindow->UI_GetLocalRect().width, client.width + 60);
+  const int sizeChanges = mWindow->mSizeChanges;
+  Ask("WM_CHANGE_STATE", {3});  // iconic
+  ASSERT_TRUE(WaitFor([&] { return mLayer->IsMinimized(Handle()); }));
+  Ask("_NET_ACTIVE_WINDOW", {2});
+  ASSERT_TRUE(WaitFor([&] { return !mLayer->IsMinimized(Handle()); }));
+  Settle(100);
+  EXPECT_EQ(mWindow->mSizeChanges, sizeChanges) << "restored at its size, the window heard of no size change";
+}
+
+}  // namespace
+}  // namespace norvik::test
