@@ -92,8 +92,8 @@ bool ParseGalleryOptions(const std::vector<std::string>& inArgs, GalleryOptions&
         if (x == std::string::npos || !ReadDimension(value.substr(0, x), GalleryPage::kMinWidth, 8192, w) ||
             !ReadDimension(value.substr(x + 1), GalleryPage::kMinHeight, 8192, h)) {
           outError = Localized(
-              "$$$/norvik/gallery/Error/BadSize=The size ^0 is not WIDTHxHEIGHT with a width from 560 and a height "
-              "from 420 up to 8192 pixels.",
+              "$$$/norvik/gallery/Error/BadSize=The size ^0 is not WIDTHxHEIGHT with a width from 860 and a height "
+              "from 600 up to 8192 pixels.",
               value);
           return false;
         }

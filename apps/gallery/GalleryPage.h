@@ -45,8 +45,8 @@ class GalleryPage : public ui::UI_SubView {
   static constexpr float kSelectorHeight = 30;
   static constexpr float kMargin = 14;
   // The smallest size the sections still fit in.
-  static constexpr long kMinWidth = 560;
-  static constexpr long kMinHeight = 420;
+  static constexpr long kMinWidth = 860;
+  static constexpr long kMinHeight = 600;
 
  private:
   void Arrange();

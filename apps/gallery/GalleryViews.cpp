@@ -5,6 +5,7 @@
 
 #include "tarsel/Localizer.h"
 #include "ui/MouseEvent.h"
+#include "ui/UI_NodeManager.h"
 #include "ui/Theme.h"
 
 namespace norvik::gallery {
@@ -329,27 +330,43 @@ void BrightnessSwitch::SetLight(bool inLight) {
 
 bool BrightnessSwitch::UI_DoMouseEvent(ui::UI_Node*, const ui::MouseEvent& inEvent) {
   if (!inEvent.IsAction(ui::MouseEvent::kActionButtonDown)) return false;
+  ui::UI_NodeP self(this);
+  UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  Toggle();
+  return true;
+}
+
+bool BrightnessSwitch::UI_DoKeyboardEvent(ui::UI_Node*, const ui::KeyboardEvent& inEvent) {
+  if (!ui::UI_NodeManager::CompareControlActivateShortcut(inEvent)) return false;
+  if (inEvent.IsActionKeyDown()) Toggle();
+  return true;
+}
+
+void BrightnessSwitch::Toggle() {
   SetLight(!mLight);
   // The change function may rebuild or repaint the page; keep this node
   // alive until it returns.
   ui::UI_NodeP self(this);
   if (mChange) mChange(mLight);
-  return true;
 }
 
+// A switch named after what it turns on: on is the light look, whichever
+// look is showing, so the label never reads as a state and an action at once.
 void BrightnessSwitch::UI_Draw(drawbot::Drawbot* inDrawbot) {
   const GalleryColors c = CurrentColors();
   const RectF r = UI_GetLocalRectF(false);
   const float trackW = 38, trackH = 20;
-  const RectF track(r.width - trackW, (r.height - trackH) / 2, trackW, trackH);
+  const RectF track(r.width - trackW - 3, (r.height - trackH) / 2, trackW, trackH);
   FillRoundRect(inDrawbot, track, trackH / 2, mLight ? c.accent : Mix(c.header, c.text, 0.25f));
   if (UI_IsMouseOver(true)) StrokeRoundRect(inDrawbot, track, trackH / 2, c.text, 1);
+  if (UI_HasKeyboardFocus(true))
+    StrokeRoundRect(inDrawbot, RectF(track.left - 3, track.top - 3, trackW + 6, trackH + 6), trackH / 2 + 3, c.accent,
+                    2);
   const float knob = trackH - 6;
   const RectF knobRect(mLight ? track.left + trackW - knob - 3 : track.left + 3, track.top + 3, knob, knob);
   FillRoundRect(inDrawbot, knobRect, knob / 2, ColorRGBA(0.97f, 0.97f, 0.97f, 1));
-  DrawLabel(inDrawbot,
-            mLight ? Text("$$$/norvik/gallery/Switch/Light=Light") : Text("$$$/norvik/gallery/Switch/Dark=Dark"),
-            RectF(0, 0, r.width - trackW - 8, r.height), c.text, drawbot::kTextAlignRight);
+  DrawLabel(inDrawbot, Text("$$$/norvik/gallery/Switch/LightLook=Light look"),
+            RectF(0, 0, track.left - 8, r.height), c.text, drawbot::kTextAlignRight);
 }
 
 }  // namespace norvik::gallery

@@ -123,6 +123,11 @@ class BrightnessSwitch : public ui::UI_SubView {
   BrightnessSwitch();
   void UI_Draw(drawbot::Drawbot* inDrawbot) override;
   bool UI_DoMouseEvent(ui::UI_Node* inTarget, const ui::MouseEvent& inEvent) override;
+  // Space or Return turns it over, as with any toggle that Tab reaches.
+  bool UI_DoKeyboardEvent(ui::UI_Node* inTarget, const ui::KeyboardEvent& inEvent) override;
+  bool UI_WantsKeyboardFocus() const override { return true; }
+  bool UI_WantsKeyboardFocusFromAdvance() const override { return true; }
+  bool UI_InvalidateOnKeyboardFocusChange(bool) const override { return true; }
   bool UI_InvalidateOnMouseOverChange(bool) const override { return true; }
   bool IsLight() const { return mLight; }
   // Sets the state without calling the change function.
@@ -130,6 +135,7 @@ class BrightnessSwitch : public ui::UI_SubView {
   void SetChangeFunction(ChangeFunction inF) { mChange = std::move(inF); }
 
  private:
+  void Toggle();
   bool mLight = false;
   ChangeFunction mChange;
 };

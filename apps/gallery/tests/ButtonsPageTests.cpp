@@ -116,8 +116,8 @@ TEST_F(ButtonsPageTest, EveryKindHasASampleInEachOfItsStatesInsideItsOwnCell) {
   EXPECT_GE(live.top, grid.top + grid.height);
 }
 
-TEST_F(ButtonsPageTest, InASmallerWindowTheSamplesStillKeepToTheirCells) {
-  Open(true, 800, 560);
+TEST_F(ButtonsPageTest, InTheSmallestWindowTheSamplesStillKeepToTheirCells) {
+  Open(true, GalleryPage::kMinWidth, GalleryPage::kMinHeight);
   page->ShowPage(GalleryPageID::kButtons);
   EXPECT_EQ(ExpectSamplesInsideTheirCells(), Grid()->GetSampleCount());
 }
@@ -252,6 +252,8 @@ TEST_F(ButtonsPageTest, TheSelectorSwitchesBetweenThePagesByClicks) {
 TEST_F(ButtonsPageTest, TheArrowKeysSwitchPagesOnceTheSelectorHasTheFocus) {
   Open(true);
   constexpr int kVirtualKeyTab = 0x09, kVirtualKeyLeft = 0x25, kVirtualKeyRight = 0x27;
+  system.TypeKey(kVirtualKeyTab);  // the light-look switch, then the selector
+  system.Pump();
   system.TypeKey(kVirtualKeyTab);
   system.Pump();
   ASSERT_TRUE(page->GetPageSelector()->UI_HasKeyboardFocus(false));

@@ -58,12 +58,12 @@ class GalleryProgram : public ::testing::Test {
 TEST_F(GalleryProgram, ScreenshotWritesAPNGOfTheRequestedSizeAndExitsZero) {
   const std::string path = (dir / "shot.png").string();
   std::filesystem::remove(path);
-  ProgramRun run = RunGallery("--screenshot '" + path + "' --size 800x500 --light");
+  ProgramRun run = RunGallery("--screenshot '" + path + "' --size 900x640 --light");
   EXPECT_EQ(run.exitCode, 0) << run.output;
   unsigned w = 0, h = 0;
   ASSERT_TRUE(ReadPNGSize(path, w, h)) << run.output;
-  EXPECT_EQ(w, 800u);
-  EXPECT_EQ(h, 500u);
+  EXPECT_EQ(w, 900u);
+  EXPECT_EQ(h, 640u);
 }
 
 TEST_F(GalleryProgram, TheTwoLooksGiveDifferentImages) {

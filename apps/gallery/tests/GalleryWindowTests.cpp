@@ -25,6 +25,7 @@ namespace {
 
 constexpr int kVirtualKeyTab = 0x09;
 constexpr int kVirtualKeyShift = 0x10;
+constexpr int kVirtualKeySpace = 0x20;
 
 using testing::Luma;
 
@@ -123,7 +124,13 @@ TEST_F(GalleryWindowTest, TabWalksTheFocusTilesForwardAndShiftTabWalksBack) {
   Open(false);
   std::vector<ui::UI_Node*> tiles = page->GetFocusTiles();
   ASSERT_EQ(tiles.size(), static_cast<std::size_t>(FocusDemoView::kTileCount));
-  // The page selector at the top is the first stop.
+  // The light-look switch in the header is the first stop, and Space turns it.
+  system.TypeKey(kVirtualKeyTab);
+  system.Pump();
+  EXPECT_TRUE(page->GetBrightnessSwitch()->UI_HasKeyboardFocus(false));
+  system.TypeKey(kVirtualKeySpace);
+  system.Pump();
+  EXPECT_TRUE(page->IsLight());
   system.TypeKey(kVirtualKeyTab);
   system.Pump();
   EXPECT_TRUE(page->GetPageSelector()->UI_HasKeyboardFocus(false));
@@ -310,6 +317,30 @@ TEST_F(GalleryWindowTest, EverySectionHasATitleAndContentInsideIt) {
         EXPECT_LE(r.top + ir.top + ir.height, bounds.height) << id << " grandchild";
       }
     }
+  }
+}
+
+// Shown nodes under inNode that stick out of their parents: cut off, or out of reach.
+std::string Overflowing(ui::UI_Node* inNode) {
+  std::string found;
+  const RectF bounds = inNode->UI_GetLocalRectF(false);
+  for (auto it = inNode->ChildBegin(); it != inNode->ChildEnd(); ++it) {
+    if (!(*it)->UI_IsShown()) continue;
+    const RectF r = (*it)->UI_GetLocalRectF(true);
+    if (r.left < -0.5f || r.top < -0.5f || r.left + r.width > bounds.width + 0.5f ||
+        r.top + r.height > bounds.height + 0.5f)
+      found += " '" + std::string((*it)->UI_GetNodeID()) + "' in '" + std::string(inNode->UI_GetNodeID()) + "'";
+    found += Overflowing(it->get());
+  }
+  return found;
+}
+
+TEST_F(GalleryWindowTest, AtTheSmallestSizeItAcceptsNoPageHasANodeOutsideItsParent) {
+  Open(false, GalleryPage::kMinWidth, GalleryPage::kMinHeight);
+  for (GalleryPageID id : {GalleryPageID::kBasics, GalleryPageID::kButtons, GalleryPageID::kLayout, GalleryPageID::kNumbers}) {
+    page->ShowPage(id);
+    system.Pump();
+    EXPECT_EQ(Overflowing(page.get()), "") << GalleryPageName(id);
   }
 }
 

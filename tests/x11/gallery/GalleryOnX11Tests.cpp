@@ -159,7 +159,10 @@ TEST_F(GalleryOnX11, TabTypedOnTheKeyboardWalksTheFocusTilesAndShiftTabWalksBack
   const std::vector<ui::UI_Node*> tiles = mPage->GetFocusTiles();
   ASSERT_GE(tiles.size(), 2u);
   ASSERT_EQ(mLayer->GetActiveWindow(), mWindow->GetHandle()) << "the shown main window is active";
-  // The page selector at the top of the window is the first stop.
+  // The light-look switch in the header, then the page selector.
+  Key(kKeysymTab, true);
+  Key(kKeysymTab, false);
+  ASSERT_TRUE(WaitFor([&] { return mPage->GetBrightnessSwitch()->UI_HasKeyboardFocus(false); }));
   Key(kKeysymTab, true);
   Key(kKeysymTab, false);
   ASSERT_TRUE(WaitFor([&] { return mPage->GetPageSelector()->UI_HasKeyboardFocus(false); }));
