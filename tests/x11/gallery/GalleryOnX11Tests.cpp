@@ -2,7 +2,9 @@
 // a control of the page through the toolkit's window bridge, the pixels the
 // server shows are those of the headless rendering of the same page, and the
 // program itself starts, shows its first frame and exits on the display.
+#include <signal.h>
 #include <sys/wait.h>
+#include <unistd.h>
 #include <xcb/xcb.h>
 
 #include <cstdio>
@@ -20,6 +22,7 @@
 #include "controls/UI_TextButton.h"
 #include "support/drawbot/PixelCompare.h"
 #include "support/ui/XvfbServer.h"
+#include "tarsel/ErrorManager.h"
 #include "ui/HeadlessWindowSystem.h"
 #include "ui/OS_NodeManager.h"
 #include "ui/Theme.h"
@@ -236,6 +239,72 @@ TEST_F(GalleryOnX11, TheWindowManagersCloseRequestEndsTheLoopAndTheWindowIsGone)
     std::free(attributes);
     return !known;
   }, 1000)) << "the server still knows the window";
+}
+
+// Under a real window manager, started first: it frames the window (so
+// configure events come relative to the frame), holds it to its size hints,
+// and gives the focus to other clients and back; none of it may raise an X error.
+class GalleryUnderOpenbox : public GalleryOnX11 {
+ protected:
+  void SetUp() override {
+    if (!XvfbServer::Get() || std::system("command -v openbox wmctrl >/dev/null") != 0)
+      GTEST_SKIP() << "Xvfb, openbox or wmctrl is missing (scripts/install-deps.sh installs them)";
+    const std::string display = "DISPLAY=" + XvfbServer::Get()->GetDisplayName();
+    if ((mOpenbox = fork()) == 0) execlp("sh", "sh", "-c", (display + " exec openbox >/dev/null 2>&1").c_str(), nullptr);
+    for (int i = 0; i < 200 && std::system((display + " wmctrl -m >/dev/null 2>&1").c_str()) != 0; ++i) usleep(50000);
+    tarsel::config::ErrorManager::Get(true)->SetReportHandler([this](const auto&) { ++mXErrors; });
+    GalleryOnX11::SetUp();
+  }
+  void TearDown() override {
+    mWindow.reset();
+    Settle(100);
+    EXPECT_EQ(mXErrors, 0) << "X errors from starting, the test or closing";
+    tarsel::config::ErrorManager::Get(true)->SetReportHandler(nullptr);
+    GalleryOnX11::TearDown();
+    if (mOpenbox > 0) kill(mOpenbox, SIGTERM), waitpid(mOpenbox, nullptr, 0);
+  }
+  // What pagers and wmctrl send the window manager about a window.
+  void Ask(const char* inType, std::initializer_list<std::uint32_t> inData, std::uintptr_t inWindow = 0) {
+    xcb_intern_atom_reply_t* atom = xcb_intern_atom_reply(mUser, xcb_intern_atom(mUser, 0, std::strlen(inType), inType), 0);
+    xcb_client_message_event_t message{XCB_CLIENT_MESSAGE, 32, 0,
+                                       static_cast<xcb_window_t>(inWindow ? inWindow : mWindow->GetHandle()), atom->atom, {}};
+    std::free(atom);
+    std::copy(inData.begin(), inData.end(), message.data.data32);
+    xcb_send_event(mUser, 0, mXTest->GetRoot(), XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT, reinterpret_cast<const char*>(&message));
+    xcb_flush(mUser);
+  }
+  pid_t mOpenbox = -1;
+  int mXErrors = 0;
+};
+
+TEST_F(GalleryUnderOpenbox, HeldToItsMinimumSizeAndMovedAndResizedInOneStepItStillTakesClicksWhereItShows) {
+  Ask("_NET_MOVERESIZE_WINDOW", {0xC00 | (2u << 12), 0, 0, 300, 200});  // as wmctrl -e does
+  ASSERT_TRUE(WaitFor([&] { return mWindow->UI_GetLocalRect().height == gallery::GalleryPage::kMinHeight; }));
+  Ask("_NET_MOVERESIZE_WINDOW", {0xF00 | (2u << 12), 120, 90, 880, 610});
+  ASSERT_TRUE(WaitFor([&] { return mWindow->UI_GetLocalRect().width == 880; }));
+  Settle(150);
+  xcb_translate_coordinates_reply_t* server = xcb_translate_coordinates_reply(
+      mUser, xcb_translate_coordinates(mUser, static_cast<xcb_window_t>(mWindow->GetHandle()), mXTest->GetRoot(), 0, 0), 0);
+  ASSERT_TRUE(server);
+  EXPECT_EQ(mLayer->ClientToScreen(mWindow->GetHandle(), ui::OS_Point(0, 0)), ui::OS_Point(server->dst_x, server->dst_y));
+  std::free(server);
+  controls::UI_Checkbox* snap = Controls()->GetSnapCheckbox();
+  const bool before = snap->IsChecked();
+  ClickAt(ScreenCentre(snap));
+  EXPECT_TRUE(WaitFor([&] { return snap->IsChecked() != before; })) << "the click missed the checkbox";
+}
+
+TEST_F(GalleryUnderOpenbox, FocusInsideTheWindowComesBackWhenActivationReturnsFromAnotherClient) {
+  ui::UI_Node* tile = mPage->GetFocusTiles()[2];
+  tile->UI_GainKeyboardFocus(ui::kFocusChangeMouse);
+  const xcb_window_t other = xcb_generate_id(mUser);
+  xcb_create_window(mUser, 0, other, mXTest->GetRoot(), 600, 500, 300, 200, 0, XCB_WINDOW_CLASS_INPUT_OUTPUT, 0, 0, 0);
+  xcb_map_window(mUser, other);
+  Ask("_NET_ACTIVE_WINDOW", {2}, other);
+  ASSERT_TRUE(WaitFor([&] { return mLayer->GetActiveWindow() == 0; })) << "the other client never took the focus";
+  EXPECT_FALSE(mManager.IsApplicationFrontmost());
+  Ask("_NET_ACTIVE_WINDOW", {2});
+  EXPECT_TRUE(WaitFor([&] { return tile->UI_HasKeyboardFocus(true); })) << "the tile lost its focus";
 }
 
 // The program as a user starts it on the display: it maps its window, paints
