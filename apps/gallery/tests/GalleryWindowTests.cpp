@@ -323,14 +323,12 @@ TEST_F(GalleryWindowTest, EverySectionHasATitleAndContentInsideIt) {
 // Shown nodes under inNode that stick out of their parents: cut off, or out of reach.
 std::string Overflowing(ui::UI_Node* inNode) {
   std::string found;
-  const RectF bounds = inNode->UI_GetLocalRectF(false);
+  const RectF in = inNode->UI_GetLocalRectF(false);
   for (auto it = inNode->ChildBegin(); it != inNode->ChildEnd(); ++it) {
-    if (!(*it)->UI_IsShown()) continue;
     const RectF r = (*it)->UI_GetLocalRectF(true);
-    if (r.left < -0.5f || r.top < -0.5f || r.left + r.width > bounds.width + 0.5f ||
-        r.top + r.height > bounds.height + 0.5f)
-      found += " '" + std::string((*it)->UI_GetNodeID()) + "' in '" + std::string(inNode->UI_GetNodeID()) + "'";
-    found += Overflowing(it->get());
+    if ((*it)->UI_IsShown() && (r.left < 0 || r.top < 0 || r.Right() > in.width + 0.5f || r.Bottom() > in.height + 0.5f))
+      found += " " + std::string((*it)->UI_GetNodeID()) + " in " + std::string(inNode->UI_GetNodeID());
+    if ((*it)->UI_IsShown()) found += Overflowing(it->get());
   }
   return found;
 }
@@ -338,8 +336,7 @@ std::string Overflowing(ui::UI_Node* inNode) {
 TEST_F(GalleryWindowTest, AtTheSmallestSizeItAcceptsNoPageHasANodeOutsideItsParent) {
   Open(false, GalleryPage::kMinWidth, GalleryPage::kMinHeight);
   for (GalleryPageID id : {GalleryPageID::kBasics, GalleryPageID::kButtons, GalleryPageID::kLayout, GalleryPageID::kNumbers}) {
-    page->ShowPage(id);
-    system.Pump();
+    page->ShowPage(id), system.Pump();
     EXPECT_EQ(Overflowing(page.get()), "") << GalleryPageName(id);
   }
 }
