@@ -256,7 +256,7 @@ class GalleryUnderOpenbox : public GalleryOnX11 {
     GalleryOnX11::SetUp();
   }
   void TearDown() override {
-    mWindow.reset(), Settle(100);
+    if (mLayer) mWindow.reset(), Settle(100);
     EXPECT_EQ(mXErrors, 0) << "X errors from starting, the test or closing";
     tarsel::config::ErrorManager::Get(true)->SetReportHandler(nullptr);
     GalleryOnX11::TearDown();
@@ -275,11 +275,7 @@ TEST_F(GalleryUnderOpenbox, HeldToItsMinimumSizeAndMovedAndResizedInOneStepItSti
   ASSERT_TRUE(WaitFor([&] { return mWindow->UI_GetLocalRect().height == gallery::GalleryPage::kMinHeight; }));
   Ask("_NET_MOVERESIZE_WINDOW", {0xF00 | (2u << 12), 120, 90, 880, 610});
   ASSERT_TRUE(WaitFor([&] { return mWindow->UI_GetLocalRect().width == 880; }));
-  Settle(150);
-  xcb_translate_coordinates_reply_t* server = xcb_translate_coordinates_reply(
-      mUser, xcb_translate_coordinates(mUser, static_cast<xcb_window_t>(mWindow->GetHandle()), mXTest->GetRoot(), 0, 0), 0);
-  EXPECT_EQ(mLayer->ClientToScreen(mWindow->GetHandle(), ui::OS_Point(0, 0)), ui::OS_Point(server->dst_x, server->dst_y));
-  std::free(server);
+  // Placed where the layer thinks the window is: a stale position misses.
   controls::UI_Checkbox* snap = Controls()->GetSnapCheckbox();
   ClickAt(ScreenCentre(snap));
   EXPECT_TRUE(WaitFor([&] { return !snap->IsChecked(); })) << "the click missed the checkbox";
