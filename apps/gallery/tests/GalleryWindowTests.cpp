@@ -24,8 +24,7 @@ namespace norvik::gallery {
 namespace {
 
 constexpr int kVirtualKeyTab = 0x09;
-constexpr int kVirtualKeyShift = 0x10;
-constexpr int kVirtualKeySpace = 0x20;
+constexpr int kVirtualKeyShift = 0x10, kVirtualKeySpace = 0x20;
 
 using testing::Luma;
 
